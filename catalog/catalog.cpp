@@ -1,0 +1,100 @@
+#include "catalog.hpp"
+
+#include "naming.hpp"
+#include "signature.hpp"
+
+#include <algorithm>
+#include <tuple>
+
+namespace catalog
+{
+
+namespace
+{
+
+using detail::Cursor;
+
+/// Steps and parameters as the signature has them.
+template <class... A> void readSignature(Export& entry)
+{
+    const auto read = [&entry, side = &entry.source, afterRoi = false]<class T>(std::type_identity<T>) mutable {
+        if constexpr (std::is_same_v<T, RoiSize>) {
+            afterRoi = true;
+        } else if (afterRoi) {
+            ++entry.parameterCount;
+        } else if constexpr (std::is_same_v<T, int>) {
+            side->steps = Steps::one;
+        } else if constexpr (std::is_same_v<T, const int*>) {
+            side->steps = Steps::each;
+        } else {
+            using Plane = std::remove_pointer_t<T>; // the sample, or the pointer to a plane's samples
+            using Sample = std::conditional_t<std::is_pointer_v<Plane>, std::remove_pointer_t<Plane>, Plane>;
+            if (!std::is_const_v<Sample> && !entry.inPlace) side = &entry.target;
+            side->steps = Steps::none;
+        }
+    };
+    auto reader = read;
+    (reader(std::type_identity<A>{}), ...);
+    for (Side* side : {&entry.source, &entry.target}) {
+        if (side->arrangement == Arrangement::semiPlanar) side->steps = Steps::each;
+    }
+    if (entry.inPlace) entry.target = entry.source;
+}
+
+template <class... A>
+Export describe(std::string_view name, PyxStatus(PYXCC_CALL* function)(A...), Family family, const Traits& traits)
+{
+    detail::Naming naming = detail::readName(name);
+    Export entry{};
+    entry.name = name;
+    entry.family = family;
+    entry.traits = traits;
+    entry.source = std::move(naming.source);
+    entry.target = std::move(naming.target);
+    entry.variant = std::move(naming.variant);
+    entry.inPlace = naming.inPlace;
+    entry.stepless = naming.stepless;
+    readSignature<A...>(entry);
+    entry.function = reinterpret_cast<Function>(function);
+    entry.invoke = naming.inPlace ? &detail::invoke<true, A...> : &detail::invoke<false, A...>;
+    return entry;
+}
+
+const std::vector<Export>& table()
+{
+    static const std::vector<Export> entries = {
+#define EXPORT(name, family, ...) describe(#name, &::name, Family::family, Traits{__VA_ARGS__}),
+#include "exports.def"
+#undef EXPORT
+    };
+    return entries;
+}
+
+constexpr std::pair<std::string_view, int> elements[] = {{"u8", 1},  {"s8", 1},  {"u16", 2}, {"s16", 2},
+                                                         {"s32", 4}, {"f32", 4}, {"f64", 8}, {"bit", 1}};
+
+} // namespace
+
+int sizeOf(Element element) { return elements[static_cast<int>(element)].second; }
+
+std::string_view nameOf(Element element) { return elements[static_cast<int>(element)].first; }
+
+PlaneShape shapeOf(const Side& side, int plane, RoiSize roi)
+{
+    const bool chroma = (plane == 1 || plane == 2) && side.arrangement != Arrangement::interleaved;
+    const int width = chroma ? roi.width >> side.chromaX : roi.width;
+    const int height = chroma ? roi.height >> side.chromaY : roi.height;
+    const int samples = chroma && side.arrangement == Arrangement::semiPlanar ? 2 : side.samples;
+    return {std::max(width, 0) * samples * sizeOf(side.element), std::max(height, 0)};
+}
+
+std::span<const Export> exports() { return table(); }
+
+const Export* find(std::string_view name)
+{
+    const auto all = exports();
+    const auto at = std::ranges::find(all, name, &Export::name);
+    return at == all.end() ? nullptr : &*at;
+}
+
+} // namespace catalog

@@ -1,0 +1,153 @@
+// The catalogue: what each export of the library is, in enough detail to make a valid call of it, or an invalid one.
+//
+// Tests, benchmarks and the command-line tool walk it, so that a row in exports.def covers a new export everywhere.
+// Nothing of it is part of the library.
+#pragma once
+
+#include "pyxcc/pyxcc.h"
+
+#include <array>
+#include <optional>
+#include <span>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace catalog
+{
+
+enum class Element { u8, s8, u16, s16, s32, f32, f64, bit };
+
+/// Size of a sample in bytes; a bit counts as a byte, since images are laid out in whole bytes.
+int sizeOf(Element element);
+std::string_view nameOf(Element element);
+
+enum class Family {
+    rgbYCbCr,
+};
+
+struct FamilyInfo {
+    Family family;
+    std::string_view slug;  ///< as in `pyxcc list`
+    std::string_view title; ///< a heading
+    std::string_view text;  ///< what it does, in a sentence or two
+};
+
+std::span<const FamilyInfo> families();
+const FamilyInfo& infoOf(Family family);
+
+/// The order of an export's argument tests. Pointers: image pointers, arrays and pointer parameters; elements: those of
+/// the plane arrays. Both yield pyxErrNullPtr.
+enum class Order {
+    pointersElementsSize,
+    pointersSizeElements,
+};
+
+/// Pointers that an export does not test, so that a null one must not be passed.
+enum class Untested { none, targetArray };
+
+/// When the work is done and pyxWarnOddSize comes back all the same.
+enum class Warning { never, oddWidth, oddSize };
+
+/// The smallest size, and what the size must be a multiple of. A minimum of `any` is not tested at all.
+struct Minimum {
+    static constexpr int any = -1;
+    int width = 1;
+    int height = 1;
+    int widthMultiple = 1;
+    int heightMultiple = 1;
+};
+
+/// An argument after the region: a number, or a pointer to `count` numbers.
+struct Parameter {
+    std::string_view name;
+    double low = 0, high = 0; ///< the values that make sense
+    int count = 0;            ///< 0 for a number
+};
+
+inline constexpr Parameter aval{"aval", 0, 255};
+
+/// What the name and the signature do not tell. A row of exports.def sets what departs from the defaults, in this
+/// order.
+struct Traits {
+    Order order = Order::pointersElementsSize;
+    Untested untested = Untested::none;
+    Minimum minimum = {};
+    Warning warning = Warning::never;
+    std::array<Parameter, 4> parameters = {};
+};
+
+enum class Arrangement {
+    interleaved, ///< one plane; `samples` a pixel
+    planar,      ///< `planes` planes of one sample each
+    semiPlanar,  ///< a plane of luma and one of chroma pairs
+};
+
+enum class Steps { none, one, each };
+
+/// One end of a conversion.
+struct Side {
+    std::string model;  ///< "RGB", "YCbCr420"; empty where any will do
+    std::string layout; ///< "C3", "AC4", "P2"
+    Element element = Element::u8;
+    Arrangement arrangement = Arrangement::interleaved;
+    int samples = 1;              ///< interleaved samples a pixel
+    int planes = 1;               ///< memory planes
+    Steps steps = Steps::one;     ///< how the signature gives the steps
+    int chromaX = 0, chromaY = 0; ///< chroma is shared by 1 << chromaX columns and 1 << chromaY rows
+    bool spareFourth = false;     ///< AC4: the fourth sample is not read, or keeps its value
+};
+
+/// The part of a plane that a region covers.
+struct PlaneShape {
+    int rowBytes;
+    int rows;
+};
+
+PlaneShape shapeOf(const Side& side, int plane, RoiSize roi);
+
+/// The arguments of a call, by role. An in-place export takes its image from `source`.
+struct Invocation {
+    struct Value {
+        double number = 0;
+        const void* pointer = nullptr;
+    };
+    std::array<void*, 4> source = {};
+    std::array<void*, 4> target = {};
+    std::array<int, 4> sourceStep = {};
+    std::array<int, 4> targetStep = {};
+    bool sourceArrayNull = false; ///< passes null for the array of planes
+    bool targetArrayNull = false;
+    RoiSize roi = {0, 0};
+    std::array<Value, 4> parameters = {};
+};
+
+/// A function with an export's signature, which Export::call restores.
+using Function = void (*)();
+
+struct Export {
+    std::string_view name;
+    Family family;
+    Traits traits;
+    Side source;
+    Side target; ///< equals `source` for in-place exports
+    std::string variant;
+    bool inPlace = false;
+    bool stepless = false;
+    int parameterCount = 0;
+    Function function = nullptr;
+
+    /// Calls the library's function, or another one of the same signature.
+    PyxStatus call(const Invocation& arguments) const { return invoke(function, arguments); }
+    PyxStatus call(Function other, const Invocation& arguments) const { return invoke(other, arguments); }
+
+    PyxStatus (*invoke)(Function, const Invocation&) = nullptr;
+};
+
+/// All conversions in alphabetical order.
+std::span<const Export> exports();
+
+/// The conversion of that name, or null.
+const Export* find(std::string_view name);
+
+} // namespace catalog

@@ -1,0 +1,68 @@
+// Takes an export's C signature apart at compile time: how its arguments are drawn from an Invocation.
+#pragma once
+
+#include "catalog.hpp"
+
+#include <tuple>
+#include <type_traits>
+
+namespace catalog::detail
+{
+
+/// What is known of a signature besides the types: which roles its image arguments have had so far.
+struct Cursor {
+    int side = 0; // 0: source, 1: target
+    int planes[2] = {0, 0};
+    int parameter = 0;
+    bool inPlace = false;
+    bool afterRoi = false;
+};
+
+/// Draws the argument of type A from the invocation and moves the cursor on. An image pointer comes before its step.
+template <class A> A take(Cursor& at, const Invocation& call)
+{
+    const auto image = [&](bool isTarget) {
+        at.side = isTarget && !at.inPlace ? 1 : 0;
+        return at.side == 1 ? call.target.data() : call.source.data();
+    };
+    if constexpr (std::is_same_v<A, RoiSize>) {
+        at.afterRoi = true;
+        return call.roi;
+    } else if constexpr (std::is_same_v<A, int> || std::is_arithmetic_v<A>) {
+        if constexpr (std::is_same_v<A, int>) {
+            if (!at.afterRoi) {
+                const int plane = at.planes[at.side] - 1;
+                return at.side == 1 ? call.targetStep[plane] : call.sourceStep[plane];
+            }
+        }
+        return static_cast<A>(call.parameters[at.parameter++].number);
+    } else if constexpr (std::is_same_v<A, const int*>) {
+        return at.side == 1 ? call.targetStep.data() : call.sourceStep.data();
+    } else {
+        static_assert(std::is_pointer_v<A>);
+        using Pointee = std::remove_pointer_t<A>;
+        if (at.afterRoi) return static_cast<A>(call.parameters[at.parameter++].pointer);
+        if constexpr (std::is_pointer_v<Pointee>) { // an array of planes
+            using Sample = std::remove_pointer_t<Pointee>;
+            void* const* planes = image(!std::is_const_v<Sample>);
+            at.planes[at.side] = 1; // one step, or an array of them, follows
+            const bool null = at.side == 1 ? call.targetArrayNull : call.sourceArrayNull;
+            return null ? nullptr : reinterpret_cast<A>(planes);
+        } else {
+            void* const* planes = image(!std::is_const_v<Pointee>);
+            return static_cast<A>(planes[at.planes[at.side]++]);
+        }
+    }
+}
+
+template <bool InPlace, class... A> PyxStatus invoke(Function function, const Invocation& call)
+{
+    Cursor at;
+    at.inPlace = InPlace;
+    const auto typed = reinterpret_cast<PyxStatus(PYXCC_CALL*)(A...)>(function);
+    // A braced list is evaluated from left to right, as the cursor needs it.
+    const std::tuple<A...> arguments{take<A>(at, call)...};
+    return std::apply(typed, arguments);
+}
+
+} // namespace catalog::detail

@@ -1,0 +1,43 @@
+// Argument tests, declared in the order in which they are made:
+//
+//     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
+//
+// A test is made only if those before it have passed, so elements are read of arrays that are known not to be null.
+#pragma once
+
+#include "pyxcc/types.h"
+
+namespace pyxcc::frame
+{
+
+/// None of the pointers is null: images, plane arrays and parameters.
+template <class... T> auto notNull(const T*... pointers)
+{
+    return [=]() -> PyxStatus { return ((pointers != nullptr) && ...) ? pyxOk : pyxErrNullPtr; };
+}
+
+/// None of the first `Count` elements of a plane array is null.
+template <int Count, class T> auto elementsNotNull(T* const* planes)
+{
+    return [=]() -> PyxStatus {
+        for (int i = 0; i < Count; ++i) {
+            if (!planes[i]) return pyxErrNullPtr;
+        }
+        return pyxOk;
+    };
+}
+
+inline auto sizeAtLeast(RoiSize roi, int width, int height)
+{
+    return [=]() -> PyxStatus { return roi.width >= width && roi.height >= height ? pyxOk : pyxErrSize; };
+}
+
+/// The result of the first test that fails, or pyxOk.
+template <class... Test> PyxStatus firstFailure(const Test&... tests)
+{
+    PyxStatus status = pyxOk;
+    static_cast<void>((((status = tests()) == pyxOk) && ...));
+    return status;
+}
+
+} // namespace pyxcc::frame
