@@ -41,7 +41,7 @@ template <class A> A take(Cursor& at, const Invocation& call)
     } else {
         static_assert(std::is_pointer_v<A>);
         using Pointee = std::remove_pointer_t<A>;
-        if (at.afterRoi) return static_cast<A>(call.parameters[at.parameter++].pointer);
+        if (at.afterRoi) return static_cast<A>(const_cast<void*>(call.parameters[at.parameter++].pointer));
         if constexpr (std::is_pointer_v<Pointee>) { // an array of planes
             using Sample = std::remove_pointer_t<Pointee>;
             void* const* planes = image(!std::is_const_v<Sample>);
