@@ -1,0 +1,151 @@
+#include "reference/rgb_ycbcr.hpp"
+
+#include "reference/arguments.hpp"
+#include "reference/bt601.hpp"
+#include "reference/image.hpp"
+
+namespace reference
+{
+
+namespace
+{
+
+using Form = Triple8 (*)(Triple8);
+
+/// The whole blocks of a row take the wide form, the pixels that are left take the tail form.
+void convert(const Image<const u8>& src, const Image<u8>& dst, RoiSize roi, int block, Form wide, Form tail)
+{
+    const int blocksEnd = roi.width / block * block;
+    for (int row = 0; row < roi.height; ++row) {
+        for (int column = 0; column < roi.width; ++column) {
+            const Form form = column < blocksEnd ? wide : tail;
+            const Triple8 pixel = form({src[0].get(row, column), src[1].get(row, column), src[2].get(row, column)});
+            for (int k = 0; k < 3; ++k) dst[k].set(row, column, pixel[k]);
+        }
+    }
+}
+
+void convert(const Image<const u8>& src, const Image<u8>& dst, RoiSize roi, Form form)
+{
+    convert(src, dst, roi, 1, form, form);
+}
+
+void fill(const Channel<u8>& dst, RoiSize roi, u8 value)
+{
+    for (int row = 0; row < roi.height; ++row) {
+        for (int column = 0; column < roi.width; ++column) dst.set(row, column, value);
+    }
+}
+
+/// The same samples with the first and the third channel exchanged.
+Image<u8> reversed(const Image<u8>& image) { return {image[2], image[1], image[0], image[3]}; }
+
+} // namespace
+
+PyxStatus pyxiRGBToYCbCr_8u_C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
+{
+    if (anyNull(src, dst)) return pyxErrNullPtr;
+    if (isSmaller(roi, 1, 1)) return pyxErrSize;
+    convert(interleaved(src, srcStep, 3), interleaved(dst, dstStep, 3), roi, 16, fwdRound, fwdExact);
+    return pyxOk;
+}
+
+PyxStatus pyxiRGBToYCbCr_8u_AC4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
+{
+    if (anyNull(src, dst)) return pyxErrNullPtr;
+    if (isSmaller(roi, 1, 1)) return pyxErrSize;
+    convert(interleaved(src, srcStep, 4), interleaved(dst, dstStep, 4), roi, fwdExact);
+    return pyxOk;
+}
+
+PyxStatus pyxiRGBToYCbCr_8u_C3P3R(const u8* src, int srcStep, u8* const dst[3], int dstStep, RoiSize roi)
+{
+    if (anyNull(src, dst) || anyPlaneNull(dst)) return pyxErrNullPtr;
+    if (isSmaller(roi, 1, 1)) return pyxErrSize;
+    convert(interleaved(src, srcStep, 3), planar(dst, dstStep), roi, 8, fwdHigh, fwdExact);
+    return pyxOk;
+}
+
+// The array of targets is read without a test of its own.
+PyxStatus pyxiRGBToYCbCr_8u_AC4P3R(const u8* src, int srcStep, u8* const dst[3], int dstStep, RoiSize roi)
+{
+    if (anyNull(src) || anyPlaneNull(dst)) return pyxErrNullPtr;
+    if (isSmaller(roi, 1, 1)) return pyxErrSize;
+    convert(interleaved(src, srcStep, 4), planar(dst, dstStep), roi, 8, fwdHigh, fwdExact);
+    return pyxOk;
+}
+
+PyxStatus pyxiRGBToYCbCr_8u_P3R(const u8* const src[3], int srcStep, u8* const dst[3], int dstStep, RoiSize roi)
+{
+    if (anyNull(src, dst)) return pyxErrNullPtr;
+    if (isSmaller(roi, 1, 1)) return pyxErrSize;
+    if (anyPlaneNull(src) || anyPlaneNull(dst)) return pyxErrNullPtr;
+    convert(planar(src, srcStep), planar(dst, dstStep), roi, 8, fwdHigh, fwdExact);
+    return pyxOk;
+}
+
+PyxStatus pyxiYCbCrToRGB_8u_C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
+{
+    if (anyNull(src, dst)) return pyxErrNullPtr;
+    if (isSmaller(roi, 1, 1)) return pyxErrSize;
+    convert(interleaved(src, srcStep, 3), interleaved(dst, dstStep, 3), roi, 4, invHighA, invExactA);
+    return pyxOk;
+}
+
+PyxStatus pyxiYCbCrToRGB_8u_AC4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
+{
+    if (anyNull(src, dst)) return pyxErrNullPtr;
+    if (isSmaller(roi, 1, 1)) return pyxErrSize;
+    convert(interleaved(src, srcStep, 4), interleaved(dst, dstStep, 4), roi, invExactA);
+    return pyxOk;
+}
+
+PyxStatus pyxiYCbCrToRGB_8u_P3R(const u8* const src[3], int srcStep, u8* const dst[3], int dstStep, RoiSize roi)
+{
+    if (anyNull(src, dst)) return pyxErrNullPtr;
+    if (isSmaller(roi, 1, 1)) return pyxErrSize;
+    if (anyPlaneNull(src) || anyPlaneNull(dst)) return pyxErrNullPtr;
+    convert(planar(src, srcStep), planar(dst, dstStep), roi, 4, invHighB, invExactB);
+    return pyxOk;
+}
+
+PyxStatus pyxiYCbCrToRGB_8u_P3C3R(const u8* const src[3], int srcStep, u8* dst, int dstStep, RoiSize roi)
+{
+    if (anyNull(src, dst)) return pyxErrNullPtr;
+    if (isSmaller(roi, 1, 1)) return pyxErrSize;
+    if (anyPlaneNull(src)) return pyxErrNullPtr;
+    convert(planar(src, srcStep), interleaved(dst, dstStep, 3), roi, 8, invHighC, invExactC);
+    return pyxOk;
+}
+
+PyxStatus pyxiYCbCrToRGB_8u_P3C4R(const u8* const src[3], int srcStep, u8* dst, int dstStep, RoiSize roi, u8 aval)
+{
+    if (anyNull(src, dst)) return pyxErrNullPtr;
+    if (isSmaller(roi, 1, 1)) return pyxErrSize;
+    if (anyPlaneNull(src)) return pyxErrNullPtr;
+    const auto target = interleaved(dst, dstStep, 4);
+    convert(planar(src, srcStep), target, roi, 8, invHighD, invExactD);
+    fill(target[3], roi, aval);
+    return pyxOk;
+}
+
+PyxStatus pyxiYCbCrToBGR_8u_P3C3R(const u8* const src[3], int srcStep, u8* dst, int dstStep, RoiSize roi)
+{
+    if (anyNull(src, dst) || anyPlaneNull(src)) return pyxErrNullPtr;
+    if (isSmaller(roi, 1, 1)) return pyxErrSize;
+    const auto target = reversed(interleaved(dst, dstStep, 3));
+    convert(planar(src, srcStep), target, roi, invHighC);
+    return pyxOk;
+}
+
+PyxStatus pyxiYCbCrToBGR_8u_P3C4R(const u8* const src[3], int srcStep, u8* dst, int dstStep, RoiSize roi, u8 aval)
+{
+    if (anyNull(src, dst) || anyPlaneNull(src)) return pyxErrNullPtr;
+    if (isSmaller(roi, 1, 1)) return pyxErrSize;
+    const auto target = reversed(interleaved(dst, dstStep, 4));
+    convert(planar(src, srcStep), target, roi, invHighD);
+    fill(target[3], roi, aval);
+    return pyxOk;
+}
+
+} // namespace reference
