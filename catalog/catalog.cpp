@@ -4,6 +4,7 @@
 #include "signature.hpp"
 
 #include <algorithm>
+#include <bit>
 #include <tuple>
 
 namespace catalog
@@ -14,6 +15,24 @@ namespace
 
 using detail::Cursor;
 
+template <class T> constexpr std::string_view cName()
+{
+    if constexpr (std::is_floating_point_v<T>) {
+        return sizeof(T) == 4 ? "f32" : "f64";
+    } else {
+        constexpr std::string_view names[2][3] = {{"u8", "u16", "u32"}, {"s8", "s16", "s32"}};
+        return names[std::is_signed_v<T>][std::bit_width(sizeof(T)) - 1];
+    }
+}
+
+template <class T> constexpr ParameterType parameterType()
+{
+    using Pointee = std::remove_pointer_t<T>;
+    constexpr bool matrix = std::is_array_v<Pointee>;
+    return {cName<std::remove_cv_t<std::remove_all_extents_t<Pointee>>>(), std::is_pointer_v<T>,
+            matrix ? static_cast<int>(std::extent_v<Pointee>) : 0};
+}
+
 /// Steps and parameters as the signature has them.
 template <class... A> void readSignature(Export& entry)
 {
@@ -21,7 +40,7 @@ template <class... A> void readSignature(Export& entry)
         if constexpr (std::is_same_v<T, RoiSize>) {
             afterRoi = true;
         } else if (afterRoi) {
-            ++entry.parameterCount;
+            entry.parameterTypes[entry.parameterCount++] = parameterType<T>();
         } else if constexpr (std::is_same_v<T, int>) {
             side->steps = Steps::one;
         } else if constexpr (std::is_same_v<T, const int*>) {
@@ -39,6 +58,8 @@ template <class... A> void readSignature(Export& entry)
         if (side->arrangement == Arrangement::semiPlanar) side->steps = Steps::each;
     }
     if (entry.inPlace) entry.target = entry.source;
+    Parameter& first = entry.traits.parameters[0];
+    if (entry.parameterCount == 1 && !entry.parameterTypes[0].pointer && first.name.empty()) first = aval;
 }
 
 template <class... A>
@@ -85,7 +106,9 @@ PlaneShape shapeOf(const Side& side, int plane, RoiSize roi)
     const int width = chroma ? roi.width >> side.chromaX : roi.width;
     const int height = chroma ? roi.height >> side.chromaY : roi.height;
     const int samples = chroma && side.arrangement == Arrangement::semiPlanar ? 2 : side.samples;
-    return {std::max(width, 0) * samples * sizeOf(side.element), std::max(height, 0)};
+    const int count = std::max(width, 0) * samples;
+    const int rowBytes = side.element == Element::bit ? (count + 7) / 8 : count * sizeOf(side.element);
+    return {rowBytes, std::max(height, 0)};
 }
 
 std::span<const Export> exports() { return table(); }

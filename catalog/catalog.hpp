@@ -18,7 +18,7 @@ namespace catalog
 
 enum class Element { u8, s8, u16, s16, s32, f32, f64, bit };
 
-/// Size of a sample in bytes; a bit counts as a byte, since images are laid out in whole bytes.
+/// Size of a sample in bytes, the smallest unit of memory; a bit counts as a byte here.
 int sizeOf(Element element);
 std::string_view nameOf(Element element);
 
@@ -61,11 +61,19 @@ struct Minimum {
 /// An argument after the region: a number, or a pointer to `count` numbers.
 struct Parameter {
     std::string_view name;
-    double low = 0, high = 0; ///< the values that make sense
-    int count = 0;            ///< 0 for a number
+    double low = 0, high = 0;             ///< the values that make sense
+    int count = 0;                        ///< 0 for a number
+    std::array<double, 16> standard = {}; ///< a choice that does for most pictures
 };
 
-inline constexpr Parameter aval{"aval", 0, 255};
+inline constexpr Parameter aval{"aval", 0, 255, 0, {255}};
+
+/// What the signature tells of a parameter.
+struct ParameterType {
+    std::string_view type; ///< the C type of a number: "u8", "f32"
+    bool pointer = false;
+    int columns = 0; ///< of a matrix, whose rows the pointer walks; 0 for a plain list
+};
 
 /// What the name and the signature do not tell. A row of exports.def sets what departs from the defaults, in this
 /// order.
@@ -74,7 +82,7 @@ struct Traits {
     Untested untested = Untested::none;
     Minimum minimum = {};
     Warning warning = Warning::never;
-    std::array<Parameter, 4> parameters = {};
+    std::array<Parameter, 4> parameters = {}; ///< a lone number that is not named here is `aval`
 };
 
 enum class Arrangement {
@@ -97,6 +105,9 @@ struct Side {
     int chromaX = 0, chromaY = 0; ///< chroma is shared by 1 << chromaX columns and 1 << chromaY rows
     bool spareFourth = false;     ///< AC4: the fourth sample is not read, or keeps its value
 };
+
+/// The side that a model, a layout token and an element make, as an export's name would.
+Side sideOf(std::string_view model, std::string_view layout, Element element);
 
 /// The part of a plane that a region covers.
 struct PlaneShape {
@@ -135,6 +146,7 @@ struct Export {
     bool inPlace = false;
     bool stepless = false;
     int parameterCount = 0;
+    std::array<ParameterType, 4> parameterTypes = {};
     Function function = nullptr;
 
     /// Calls the library's function, or another one of the same signature.

@@ -153,3 +153,14 @@ Naming readName(std::string_view name)
 }
 
 } // namespace catalog::detail
+
+catalog::Side catalog::sideOf(std::string_view model, std::string_view layout, Element element)
+{
+    Side side;
+    side.model = model;
+    side.element = element;
+    detail::consumeLayout(layout, side);
+    detail::setSubsampling(side);
+    detail::setPackedPixel(side);
+    return side;
+}
