@@ -75,6 +75,8 @@ Export describe(std::string_view name, PyxStatus(PYXCC_CALL* function)(A...), Fa
     entry.variant = std::move(naming.variant);
     entry.inPlace = naming.inPlace;
     entry.stepless = naming.stepless;
+    entry.source.chromaUp = traits.sourceChromaUp;
+    entry.target.chromaUp = traits.targetChromaUp;
     readSignature<A...>(entry);
     entry.function = reinterpret_cast<Function>(function);
     entry.invoke = naming.inPlace ? &detail::invoke<true, A...> : &detail::invoke<false, A...>;
@@ -91,10 +93,20 @@ const std::vector<Export>& table()
     return entries;
 }
 
-constexpr std::pair<std::string_view, int> elements[] = {{"u8", 1},  {"s8", 1},  {"u16", 2}, {"s16", 2},
+constexpr std::pair<std::string_view, int> elements[] = {{"u8", 1},  {"s8", 1},  {"u16", 2}, {"s16", 2}, {"u32", 4},
                                                          {"s32", 4}, {"f32", 4}, {"f64", 8}, {"bit", 1}};
 
+constexpr int blocks(int length, int shift, bool up) { return (length + (up ? (1 << shift) - 1 : 0)) >> shift; }
+
 } // namespace
+
+std::span<const Check> checksOf(Order order)
+{
+    using enum Check;
+    static constexpr Check elementsFirst[] = {pointers, elements, size, steps, parameters};
+    static constexpr Check elementsLate[] = {pointers, size, elements, steps, parameters};
+    return order == Order::pointersSizeElements ? elementsLate : elementsFirst;
+}
 
 int sizeOf(Element element) { return elements[static_cast<int>(element)].second; }
 
@@ -103,8 +115,8 @@ std::string_view nameOf(Element element) { return elements[static_cast<int>(elem
 PlaneShape shapeOf(const Side& side, int plane, RoiSize roi)
 {
     const bool chroma = (plane == 1 || plane == 2) && side.arrangement != Arrangement::interleaved;
-    const int width = chroma ? roi.width >> side.chromaX : roi.width;
-    const int height = chroma ? roi.height >> side.chromaY : roi.height;
+    const int width = chroma ? blocks(roi.width, side.chromaX, side.chromaUp) : roi.width;
+    const int height = chroma ? blocks(roi.height, side.chromaY, side.chromaUp) : roi.height;
     const int samples = chroma && side.arrangement == Arrangement::semiPlanar ? 2 : side.samples;
     const int count = std::max(width, 0) * samples;
     const int rowBytes = side.element == Element::bit ? (count + 7) / 8 : count * sizeOf(side.element);

@@ -16,7 +16,7 @@
 namespace catalog
 {
 
-enum class Element { u8, s8, u16, s16, s32, f32, f64, bit };
+enum class Element { u8, s8, u16, s16, u32, s32, f32, f64, bit };
 
 /// Size of a sample in bytes, the smallest unit of memory; a bit counts as a byte here.
 int sizeOf(Element element);
@@ -43,6 +43,11 @@ enum class Order {
     pointersSizeElements,
 };
 
+/// What an order is made of. Steps and parameters are tested only where the traits say so.
+enum class Check { pointers, elements, size, steps, parameters };
+
+std::span<const Check> checksOf(Order order);
+
 /// Pointers that an export does not test, so that a null one must not be passed.
 enum class Untested { none, targetArray };
 
@@ -64,6 +69,7 @@ struct Parameter {
     double low = 0, high = 0;             ///< the values that make sense
     int count = 0;                        ///< 0 for a number
     std::array<double, 16> standard = {}; ///< a choice that does for most pictures
+    PyxStatus status = pyxOk;             ///< what a number outside of them yields; pyxOk if that is not tested
 };
 
 inline constexpr Parameter aval{"aval", 0, 255, 0, {255}};
@@ -75,6 +81,11 @@ struct ParameterType {
     int columns = 0; ///< of a matrix, whose rows the pointer walks; 0 for a plain list
 };
 
+/// The samples that a source is to hold. An empty range means all of an integer type, and 0 to 1 for floats.
+struct Range {
+    double low = 0, high = 0;
+};
+
 /// What the name and the signature do not tell. A row of exports.def sets what departs from the defaults, in this
 /// order.
 struct Traits {
@@ -83,6 +94,12 @@ struct Traits {
     Minimum minimum = {};
     Warning warning = Warning::never;
     std::array<Parameter, 4> parameters = {}; ///< a lone number that is not named here is `aval`
+    bool stepsTested = false;                 ///< a step below 1 yields pyxErrStep
+    bool sourceChromaUp = false;              ///< the source has a chroma sample for a part of a block, too
+    bool targetChromaUp = false;              ///< and so has the target
+    Range range = {};                         ///< of the source's samples
+    double tolerance = 0;                     ///< by which a target sample may be off, where its last bit is left open
+    bool followsRounding = false;             ///< an integer result depends on the caller's rounding mode
 };
 
 enum class Arrangement {
@@ -103,6 +120,7 @@ struct Side {
     int planes = 1;               ///< memory planes
     Steps steps = Steps::one;     ///< how the signature gives the steps
     int chromaX = 0, chromaY = 0; ///< chroma is shared by 1 << chromaX columns and 1 << chromaY rows
+    bool chromaUp = false;        ///< a part of such a block has a sample of its own
     bool spareFourth = false;     ///< AC4: the fourth sample is not read, or keeps its value
 };
 
