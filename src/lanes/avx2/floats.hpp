@@ -1,0 +1,52 @@
+// The arithmetic vocabulary over registers of floats. Every operation rounds singly, in the mode in force.
+#pragma once
+
+#include "lanes/avx2/integers.hpp"
+
+namespace pyxcc::wide
+{
+
+struct F32 {
+    static constexpr int count = 8;
+    __m256 v;
+
+    F32() = default;
+    PYXCC_INLINE explicit F32(__m256 value) : v(value) {}
+    PYXCC_INLINE F32(f32 k) : v(_mm256_set1_ps(k)) {}
+
+    friend PYXCC_INLINE F32 operator+(F32 x, F32 y) { return F32(_mm256_add_ps(x.v, y.v)); }
+    friend PYXCC_INLINE F32 operator-(F32 x, F32 y) { return F32(_mm256_sub_ps(x.v, y.v)); }
+    friend PYXCC_INLINE F32 operator*(F32 x, F32 y) { return F32(_mm256_mul_ps(x.v, y.v)); }
+    friend PYXCC_INLINE F32 operator/(F32 x, F32 y) { return F32(_mm256_div_ps(x.v, y.v)); }
+};
+
+struct F64 {
+    static constexpr int count = 4;
+    __m256d v;
+
+    F64() = default;
+    PYXCC_INLINE explicit F64(__m256d value) : v(value) {}
+    PYXCC_INLINE F64(f64 k) : v(_mm256_set1_pd(k)) {}
+
+    friend PYXCC_INLINE F64 operator+(F64 x, F64 y) { return F64(_mm256_add_pd(x.v, y.v)); }
+    friend PYXCC_INLINE F64 operator-(F64 x, F64 y) { return F64(_mm256_sub_pd(x.v, y.v)); }
+    friend PYXCC_INLINE F64 operator*(F64 x, F64 y) { return F64(_mm256_mul_pd(x.v, y.v)); }
+    friend PYXCC_INLINE F64 operator/(F64 x, F64 y) { return F64(_mm256_div_pd(x.v, y.v)); }
+};
+
+PYXCC_INLINE F32 fused(F32 x, F32 y, F32 z) { return F32(_mm256_fmadd_ps(x.v, y.v, z.v)); }
+PYXCC_INLINE F64 fused(F64 x, F64 y, F64 z) { return F64(_mm256_fmadd_pd(x.v, y.v, z.v)); }
+
+/// x < y ? x : y, so that a NaN on either side gives y; and likewise for the greater.
+PYXCC_INLINE F32 lesser(F32 x, F32 y) { return F32(_mm256_min_ps(x.v, y.v)); }
+PYXCC_INLINE F32 greater(F32 x, F32 y) { return F32(_mm256_max_ps(x.v, y.v)); }
+
+PYXCC_INLINE F32 toF32(S32 x) { return F32(_mm256_cvtepi32_ps(x.v)); }
+
+/// To an integer in the rounding mode in force; out of range and NaN give the lowest integer.
+PYXCC_INLINE S32 nearest(F32 x) { return S32(_mm256_cvtps_epi32(x.v)); }
+
+/// To an integer towards zero; out of range and NaN give the lowest integer.
+PYXCC_INLINE S32 trunc(F32 x) { return S32(_mm256_cvttps_epi32(x.v)); }
+
+} // namespace pyxcc::wide

@@ -1,0 +1,97 @@
+// The arithmetic vocabulary over 256-bit registers: 32 bytes, 16 words, 8 double words.
+#pragma once
+
+#include "lanes/groups.hpp"
+#include "lanes/inline.hpp"
+#include "pyxcc/types.h"
+
+#include <immintrin.h>
+
+namespace pyxcc::wide
+{
+
+/// 32 samples of 8 bits, as they lie in memory.
+struct U8 {
+    static constexpr int count = 32;
+    __m256i v;
+
+    U8() = default;
+    PYXCC_INLINE explicit U8(__m256i value) : v(value) {}
+    PYXCC_INLINE U8(int k) : v(_mm256_set1_epi8(static_cast<char>(k))) {}
+};
+
+struct S16 {
+    static constexpr int count = 16;
+    __m256i v;
+
+    S16() = default;
+    PYXCC_INLINE explicit S16(__m256i value) : v(value) {}
+    PYXCC_INLINE S16(int k) : v(_mm256_set1_epi16(static_cast<short>(k))) {}
+
+    friend PYXCC_INLINE S16 operator+(S16 x, S16 y) { return S16(_mm256_add_epi16(x.v, y.v)); }
+    friend PYXCC_INLINE S16 operator-(S16 x, S16 y) { return S16(_mm256_sub_epi16(x.v, y.v)); }
+    friend PYXCC_INLINE S16 operator*(S16 x, S16 y) { return S16(_mm256_mullo_epi16(x.v, y.v)); }
+    friend PYXCC_INLINE S16 operator<<(S16 x, int n) { return S16(_mm256_slli_epi16(x.v, n)); }
+    friend PYXCC_INLINE S16 operator>>(S16 x, int n) { return S16(_mm256_srai_epi16(x.v, n)); }
+};
+
+struct U16 {
+    static constexpr int count = 16;
+    __m256i v;
+
+    U16() = default;
+    PYXCC_INLINE explicit U16(__m256i value) : v(value) {}
+    PYXCC_INLINE U16(int k) : v(_mm256_set1_epi16(static_cast<short>(k))) {}
+
+    friend PYXCC_INLINE U16 operator+(U16 x, U16 y) { return U16(_mm256_add_epi16(x.v, y.v)); }
+    friend PYXCC_INLINE U16 operator-(U16 x, U16 y) { return U16(_mm256_sub_epi16(x.v, y.v)); }
+    friend PYXCC_INLINE U16 operator*(U16 x, U16 y) { return U16(_mm256_mullo_epi16(x.v, y.v)); }
+    friend PYXCC_INLINE U16 operator<<(U16 x, int n) { return U16(_mm256_slli_epi16(x.v, n)); }
+    friend PYXCC_INLINE U16 operator>>(U16 x, int n) { return U16(_mm256_srli_epi16(x.v, n)); }
+};
+
+struct S32 {
+    static constexpr int count = 8;
+    __m256i v;
+
+    S32() = default;
+    PYXCC_INLINE explicit S32(__m256i value) : v(value) {}
+    PYXCC_INLINE S32(int k) : v(_mm256_set1_epi32(k)) {}
+
+    friend PYXCC_INLINE S32 operator+(S32 x, S32 y) { return S32(_mm256_add_epi32(x.v, y.v)); }
+    friend PYXCC_INLINE S32 operator-(S32 x, S32 y) { return S32(_mm256_sub_epi32(x.v, y.v)); }
+    friend PYXCC_INLINE S32 operator*(S32 x, S32 y) { return S32(_mm256_mullo_epi32(x.v, y.v)); }
+    friend PYXCC_INLINE S32 operator<<(S32 x, int n) { return S32(_mm256_slli_epi32(x.v, n)); }
+    friend PYXCC_INLINE S32 operator>>(S32 x, int n) { return S32(_mm256_srai_epi32(x.v, n)); }
+};
+
+/// Samples in 16-bit lanes that narrow() stores as bytes. Clamping is left to narrow(), which does it at no cost.
+struct Byte {
+    __m256i v;
+};
+
+PYXCC_INLINE U16 asU16(S16 x) { return U16(x.v); }
+PYXCC_INLINE S16 asS16(U16 x) { return S16(x.v); }
+
+PYXCC_INLINE Byte sat8(S16 x) { return {x.v}; }
+PYXCC_INLINE Byte sat8(U16 x) { return {_mm256_min_epu16(x.v, _mm256_set1_epi16(255))}; }
+PYXCC_INLINE Byte low8(S16 x) { return {_mm256_and_si256(x.v, _mm256_set1_epi16(255))}; }
+
+PYXCC_INLINE S16 mulRound15(S16 x, int k) { return S16(_mm256_mulhrs_epi16(x.v, S16(k).v)); }
+PYXCC_INLINE S16 mulHighS16(S16 x, int k) { return S16(_mm256_mulhi_epi16(x.v, S16(k).v)); }
+PYXCC_INLINE U16 mulHighU16(U16 x, int k) { return U16(_mm256_mulhi_epu16(x.v, U16(k).v)); }
+
+PYXCC_INLINE S16 addSatS16(S16 x, S16 y) { return S16(_mm256_adds_epi16(x.v, y.v)); }
+PYXCC_INLINE S16 subSatS16(S16 x, S16 y) { return S16(_mm256_subs_epi16(x.v, y.v)); }
+PYXCC_INLINE U16 addSatU16(U16 x, U16 y) { return U16(_mm256_adds_epu16(x.v, y.v)); }
+
+/// The bytes as words, zero-extended, in the order that narrow() takes back: each 128-bit lane is widened by itself.
+PYXCC_INLINE Two<S16> widen(U8 x)
+{
+    const __m256i zero = _mm256_setzero_si256();
+    return {S16(_mm256_unpacklo_epi8(x.v, zero)), S16(_mm256_unpackhi_epi8(x.v, zero))};
+}
+
+PYXCC_INLINE U8 narrow(Byte low, Byte high) { return U8(_mm256_packus_epi16(low.v, high.v)); }
+
+} // namespace pyxcc::wide

@@ -1,0 +1,8 @@
+// The arithmetic vocabulary: namespace scalar over one value, namespace wide over a register of this build's variant.
+#pragma once
+
+#include "lanes/avx2/exact_sum.hpp"
+#include "lanes/avx2/floats.hpp"
+#include "lanes/avx2/integers.hpp"
+#include "lanes/exact_sum.hpp"
+#include "lanes/scalar.hpp"

@@ -1,0 +1,63 @@
+// The arithmetic vocabulary over one value. src/lanes/avx2/ has the same names over a register.
+//
+// A lane wraps like a register's lane does: sums and products keep the low bits. Shifts of signed lanes are arithmetic,
+// shifts of unsigned ones logical.
+#pragma once
+
+#include "lanes/groups.hpp"
+#include "lanes/inline.hpp"
+#include "pyxcc/types.h"
+
+#include <algorithm>
+#include <cmath>
+#include <concepts>
+
+namespace pyxcc::scalar
+{
+
+template <std::integral T> struct Lane {
+    T v;
+
+    constexpr Lane() = default;
+    constexpr Lane(int value) : v(static_cast<T>(value)) {}
+
+    friend Lane operator+(Lane x, Lane y) { return wrap(bits(x) + bits(y)); }
+    friend Lane operator-(Lane x, Lane y) { return wrap(bits(x) - bits(y)); }
+    friend Lane operator*(Lane x, Lane y) { return wrap(bits(x) * bits(y)); }
+    friend Lane operator<<(Lane x, int n) { return wrap(bits(x) << n); }
+    friend Lane operator>>(Lane x, int n) { return Lane(static_cast<int>(x.v >> n)); }
+
+private:
+    static constexpr u32 bits(Lane x) { return static_cast<u32>(x.v); }
+    static constexpr Lane wrap(u32 value) { return Lane(static_cast<int>(value)); }
+};
+
+using U8 = Lane<u8>;
+using S16 = Lane<s16>;
+using U16 = Lane<u16>;
+using S32 = Lane<s32>;
+
+/// A sample that is ready to be stored as a byte.
+struct Byte {
+    u8 v;
+};
+
+inline U16 asU16(S16 x) { return x.v; }
+inline S16 asS16(U16 x) { return x.v; }
+
+inline Byte sat8(S16 x) { return {static_cast<u8>(std::clamp<int>(x.v, 0, 255))}; }
+inline Byte sat8(U16 x) { return {static_cast<u8>(std::min<int>(x.v, 255))}; }
+inline Byte low8(S16 x) { return {static_cast<u8>(x.v)}; }
+
+inline S16 mulRound15(S16 x, int k) { return (x.v * k + 16384) >> 15; }
+inline S16 mulHighS16(S16 x, int k) { return (x.v * k) >> 16; }
+inline U16 mulHighU16(U16 x, int k) { return static_cast<int>((static_cast<u32>(x.v) * static_cast<u32>(k)) >> 16); }
+
+inline S16 addSatS16(S16 x, S16 y) { return std::clamp(x.v + y.v, -32768, 32767); }
+inline S16 subSatS16(S16 x, S16 y) { return std::clamp(x.v - y.v, -32768, 32767); }
+inline U16 addSatU16(U16 x, U16 y) { return std::min(x.v + y.v, 65535); }
+
+inline f32 fused(f32 x, f32 y, f32 z) { return std::fma(x, y, z); }
+inline f64 fused(f64 x, f64 y, f64 z) { return std::fma(x, y, z); }
+
+} // namespace pyxcc::scalar

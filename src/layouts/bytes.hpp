@@ -1,0 +1,22 @@
+// Bytes of a row: where it starts, and short copies.
+#pragma once
+
+#include "lanes/inline.hpp"
+#include "pyxcc/types.h"
+
+#include <cstddef>
+
+namespace pyxcc::layouts
+{
+
+/// The start of row `y`, for steps of any sign.
+template <class Byte> PYXCC_INLINE Byte* rowAt(Byte* first, std::ptrdiff_t step, int y) { return first + step * y; }
+
+/// Images are walked in bytes, since a row need not be aligned to its samples.
+template <class T> PYXCC_INLINE const u8* bytes(const T* samples) { return reinterpret_cast<const u8*>(samples); }
+template <class T> PYXCC_INLINE u8* bytes(T* samples) { return reinterpret_cast<u8*>(samples); }
+
+/// Copies a partial block: few bytes, where a call of memcpy would cost more than the copy.
+void copyBytes(u8* to, const u8* from, int count);
+
+} // namespace pyxcc::layouts
