@@ -13,7 +13,7 @@ namespace pyxcc::matrix
 
 /// 32-bit sums. The chroma addends are 128 less 256 steps: keeping the low 8 bits takes the 256 away.
 struct FwdExact : frame::OnWords {
-    template <class S16> PYXCC_INLINE auto operator()(S16 R, S16 G, S16 B) const
+    template <class Word> PYXCC_INLINE auto operator()(const Word& R, const Word& G, const Word& B) const
     {
         const auto r = exact(R), g = exact(G), b = exact(B);
         return Three{low8((16843 * r + 33030 * g + 6423 * b + 0x108000) >> 16),
@@ -22,27 +22,28 @@ struct FwdExact : frame::OnWords {
     }
 };
 
-/// High halves of 16-bit products, each truncated by itself.
+/// High halves of 16-bit products, each truncated by itself: luma in 256ths of a step, chroma in 128ths, to which 16.5
+/// and 128.5 steps are added.
 struct FwdHigh : frame::OnWords {
-    template <class S16> PYXCC_INLINE auto operator()(S16 R, S16 G, S16 B) const
+    template <class Word> PYXCC_INLINE auto operator()(const Word& R, const Word& G, const Word& B) const
     {
-        const auto luma =
-            mulHighU16(asU16(R) << 8, 16843) + mulHighU16(asU16(G) << 8, 33030) + mulHighU16(asU16(B) << 8, 6423) + 128;
-        const S16 r = R << 7, g = G << 7, b = B << 7;
-        const S16 cb = mulHighS16(r, -9699) + mulHighS16(g, -19071) + mulHighS16(b, 28770) + 64;
-        const S16 cr = mulHighS16(r, 28770) + mulHighS16(g, -24117) + mulHighS16(b, -4653) + 64;
-        return Three{sat8(asS16(luma >> 8) + 16), sat8((cb >> 7) + 128), sat8((cr >> 7) + 128)};
+        const auto y = mulHighU16(asU16(R << 8), 16843) + mulHighU16(asU16(G << 8), 33030) +
+                       mulHighU16(asU16(B << 8), 6423) + (16 * 256 + 128);
+        const auto r = R << 7, g = G << 7, b = B << 7;
+        const auto cb = mulHighS16(r, -9699) + mulHighS16(g, -19071) + mulHighS16(b, 28770) + (128 * 128 + 64);
+        const auto cr = mulHighS16(r, 28770) + mulHighS16(g, -24117) + mulHighS16(b, -4653) + (128 * 128 + 64);
+        return Three{sat8(asS16(y >> 8)), sat8(cb >> 7), sat8(cr >> 7)};
     }
 };
 
 /// Rounded 16-bit products in sixty-fourths of a step: 16 steps for luma or 128 for chroma, and 2 / 64 for rounding.
 struct FwdRound : frame::OnWords {
-    template <class S16> PYXCC_INLINE auto operator()(S16 R, S16 G, S16 B) const
+    template <class Word> PYXCC_INLINE auto operator()(const Word& R, const Word& G, const Word& B) const
     {
-        const S16 r = R << 7, g = G << 7, b = B << 7;
-        const S16 y = mulRound15(r, 4211) + mulRound15(g, 8258) + mulRound15(b, 1606) + 1026;
-        const S16 cr = mulRound15(r, 7193) - mulRound15(g, 6029) - mulRound15(b, 1163) + 8194;
-        const S16 cb = mulRound15(b, 7193) - mulRound15(g, 4768) - mulRound15(r, 2425) + 8194;
+        const auto r = R << 7, g = G << 7, b = B << 7;
+        const auto y = mulRound15(r, 4211) + mulRound15(g, 8258) + mulRound15(b, 1606) + 1026;
+        const auto cr = mulRound15(r, 7193) - mulRound15(g, 6029) - mulRound15(b, 1163) + 8194;
+        const auto cb = mulRound15(b, 7193) - mulRound15(g, 4768) - mulRound15(r, 2425) + 8194;
         return Three{sat8(y >> 6), sat8(cb >> 6), sat8(cr >> 6)};
     }
 };
@@ -53,7 +54,7 @@ struct InvExactWeights {
 };
 
 template <InvExactWeights k> struct InvExact : frame::OnWords {
-    template <class S16> PYXCC_INLINE auto operator()(S16 Y, S16 Cb, S16 Cr) const
+    template <class Word> PYXCC_INLINE auto operator()(const Word& Y, const Word& Cb, const Word& Cr) const
     {
         const auto y = exact(Y), cb = exact(Cb - 128), cr = exact(Cr - 128);
         return Three{sat8((k.y * y + k.crToR * cr + k.addend) >> 16),
@@ -70,31 +71,31 @@ using InvExactD = InvExact<InvExactWeights{76282, 104593, -25689, -53279, 132184
 /// What chroma adds to the three channels, in sixteenths of a step, in the high-product forms: one chroma sample's
 /// share serves all the pixels that it covers.
 template <int CbToG> struct ChromaAdded {
-    template <class S16> static PYXCC_INLINE Three<S16> shares(S16 Cb, S16 Cr)
+    template <class Word> static PYXCC_INLINE auto shares(const Word& Cb, const Word& Cr)
     {
-        const S16 u = (Cb - 128) << 7, v = (Cr - 128) << 7;
-        return {mulHighS16(v, 13074), mulHighS16(v, -6660) + mulHighS16(u, CbToG), mulHighS16(u, 16523)};
+        const auto u = (Cb - 128) << 7, v = (Cr - 128) << 7;
+        return Three{mulHighS16(v, 13074), mulHighS16(v, -6660) + mulHighS16(u, CbToG), mulHighS16(u, 16523)};
     }
 };
 
 /// The same with the shares of G taken off as magnitudes: a truncated product and the truncated negative product are
 /// not opposites.
 template <int CbToG> struct ChromaTakenOff {
-    template <class S16> static PYXCC_INLINE Three<S16> shares(S16 Cb, S16 Cr)
+    template <class Word> static PYXCC_INLINE auto shares(const Word& Cb, const Word& Cr)
     {
-        const S16 u = (Cb - 128) << 7, v = (Cr - 128) << 7;
-        return {mulHighS16(v, 13074), S16(0) - mulHighS16(v, 6660) - mulHighS16(u, CbToG), mulHighS16(u, 16523)};
+        const auto u = (Cb - 128) << 7, v = (Cr - 128) << 7;
+        return Three{mulHighS16(v, 13074), 0 - mulHighS16(v, 6660) - mulHighS16(u, CbToG), mulHighS16(u, 16523)};
     }
 };
 
 template <int LumaWeight, int Rounding, class Chroma> struct InvHigh : frame::OnWords, Chroma {
-    template <class S16> static PYXCC_INLINE auto add(S16 Y, const Three<S16>& chroma)
+    template <class Word, class S16> static PYXCC_INLINE auto add(const Word& Y, const Three<S16>& chroma)
     {
-        const S16 y = mulHighS16((Y - 16) << 7, LumaWeight) + Rounding;
+        const auto y = mulHighS16((Y - 16) << 7, LumaWeight) + Rounding;
         return Three{sat8((y + chroma.a) >> 4), sat8((y + chroma.b) >> 4), sat8((y + chroma.c) >> 4)};
     }
 
-    template <class S16> PYXCC_INLINE auto operator()(S16 Y, S16 Cb, S16 Cr) const
+    template <class Word> PYXCC_INLINE auto operator()(const Word& Y, const Word& Cb, const Word& Cr) const
     {
         return add(Y, Chroma::shares(Cb, Cr));
     }

@@ -50,6 +50,8 @@ PYXCC_INLINE __m256i weightPair(int even, int odd)
 
 } // namespace detail
 
+PYXCC_INLINE Exact<S16> exact(const Sample& x) { return {x}; }
+
 template <std::size_t N> PYXCC_INLINE S16 shiftedSum(const ExactSum<S16, N>& sum, int shift)
 {
     const int unit = N % 2 == 1 ? detail::unitOf(sum.addend) : 0;

@@ -85,11 +85,26 @@ PYXCC_INLINE S16 addSatS16(S16 x, S16 y) { return S16(_mm256_adds_epi16(x.v, y.v
 PYXCC_INLINE S16 subSatS16(S16 x, S16 y) { return S16(_mm256_subs_epi16(x.v, y.v)); }
 PYXCC_INLINE U16 addSatU16(U16 x, U16 y) { return U16(_mm256_adds_epu16(x.v, y.v)); }
 
+/// Bytes that were just widened to words. They are at hand 256 times as large too, since a byte can be put in the upper
+/// half of a word as cheaply as in the lower one; what a form does not use is never computed.
+struct Sample : S16 {
+    U16 in256ths;
+
+    /// 7 and 8 are the scales of the high-product forms.
+    friend PYXCC_INLINE S16 operator<<(const Sample& x, int n)
+    {
+        if (n == 8) return asS16(x.in256ths);
+        if (n == 7) return asS16(x.in256ths >> 1);
+        return static_cast<const S16&>(x) << n;
+    }
+};
+
 /// The bytes as words, zero-extended, in the order that narrow() takes back: each 128-bit lane is widened by itself.
-PYXCC_INLINE Two<S16> widen(U8 x)
+PYXCC_INLINE Two<Sample> widen(U8 x)
 {
     const __m256i zero = _mm256_setzero_si256();
-    return {S16(_mm256_unpacklo_epi8(x.v, zero)), S16(_mm256_unpackhi_epi8(x.v, zero))};
+    return {{S16(_mm256_unpacklo_epi8(x.v, zero)), U16(_mm256_unpacklo_epi8(zero, x.v))},
+            {S16(_mm256_unpackhi_epi8(x.v, zero)), U16(_mm256_unpackhi_epi8(zero, x.v))}};
 }
 
 PYXCC_INLINE U8 narrow(Byte low, Byte high) { return U8(_mm256_packus_epi16(low.v, high.v)); }
