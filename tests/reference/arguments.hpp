@@ -18,4 +18,6 @@ template <typename T> bool anyPlaneNull(T* const* planes, int count = 3)
 
 inline bool isSmaller(RoiSize roi, int width, int height) { return roi.width < width || roi.height < height; }
 
+template <typename... Step> bool anyStepBelowOne(Step... steps) { return ((steps < 1) || ...); }
+
 } // namespace reference

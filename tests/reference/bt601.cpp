@@ -5,7 +5,7 @@
 namespace reference
 {
 
-Triple8 fwdExact(Triple8 rgb)
+Triple<u8> fwdExact(Triple<u8> rgb)
 {
     const auto [r, g, b] = rgb;
     return {
@@ -15,7 +15,7 @@ Triple8 fwdExact(Triple8 rgb)
     };
 }
 
-Triple8 fwdHigh(Triple8 rgb)
+Triple<u8> fwdHigh(Triple<u8> rgb)
 {
     const s32 r = rgb[0] * 128, g = rgb[1] * 128, b = rgb[2] * 128;
     const s32 y = mulHighU16(2 * r, 16843) + mulHighU16(2 * g, 33030) + mulHighU16(2 * b, 6423);
@@ -28,7 +28,7 @@ Triple8 fwdHigh(Triple8 rgb)
     };
 }
 
-Triple8 fwdRound(Triple8 rgb)
+Triple<u8> fwdRound(Triple<u8> rgb)
 {
     const s32 r = rgb[0] * 128, g = rgb[1] * 128, b = rgb[2] * 128;
     const s32 y = mulRound15(r, 4211) + mulRound15(g, 8258) + mulRound15(b, 1606);
@@ -41,7 +41,7 @@ Triple8 fwdRound(Triple8 rgb)
     };
 }
 
-Triple8 invExactA(Triple8 ycbcr)
+Triple<u8> invExactA(Triple<u8> ycbcr)
 {
     const s32 y = 76284 * ycbcr[0], cb = ycbcr[1] - 128, cr = ycbcr[2] - 128;
     return {
@@ -51,7 +51,7 @@ Triple8 invExactA(Triple8 ycbcr)
     };
 }
 
-Triple8 invExactB(Triple8 ycbcr)
+Triple<u8> invExactB(Triple<u8> ycbcr)
 {
     const s32 y = 76284 * ycbcr[0], cb = ycbcr[1] - 128, cr = ycbcr[2] - 128;
     return {
@@ -61,7 +61,7 @@ Triple8 invExactB(Triple8 ycbcr)
     };
 }
 
-Triple8 invExactC(Triple8 ycbcr)
+Triple<u8> invExactC(Triple<u8> ycbcr)
 {
     const s32 y = 76282 * ycbcr[0], cb = ycbcr[1] - 128, cr = ycbcr[2] - 128;
     return {
@@ -71,7 +71,7 @@ Triple8 invExactC(Triple8 ycbcr)
     };
 }
 
-Triple8 invExactD(Triple8 ycbcr)
+Triple<u8> invExactD(Triple<u8> ycbcr)
 {
     const s32 y = 76282 * ycbcr[0], cb = ycbcr[1] - 128, cr = ycbcr[2] - 128;
     return {
@@ -81,7 +81,7 @@ Triple8 invExactD(Triple8 ycbcr)
     };
 }
 
-Triple8 invHighA(Triple8 ycbcr)
+Triple<u8> invHighA(Triple<u8> ycbcr)
 {
     const s32 u = (ycbcr[1] - 128) * 128, v = (ycbcr[2] - 128) * 128;
     const s32 t = mulHighS16((ycbcr[0] - 16) * 128, 9536);
@@ -92,7 +92,7 @@ Triple8 invHighA(Triple8 ycbcr)
     };
 }
 
-Triple8 invHighB(Triple8 ycbcr)
+Triple<u8> invHighB(Triple<u8> ycbcr)
 {
     const s32 u = (ycbcr[1] - 128) * 128, v = (ycbcr[2] - 128) * 128;
     const s32 t = mulHighS16((ycbcr[0] - 16) * 128, 9536);
@@ -103,7 +103,7 @@ Triple8 invHighB(Triple8 ycbcr)
     };
 }
 
-Triple8 invHighC(Triple8 ycbcr)
+Triple<u8> invHighC(Triple<u8> ycbcr)
 {
     const s32 u = (ycbcr[1] - 128) * 128, v = (ycbcr[2] - 128) * 128;
     const s32 t = mulHighS16((ycbcr[0] - 16) * 128, 9535);
@@ -115,7 +115,7 @@ Triple8 invHighC(Triple8 ycbcr)
 }
 
 // Unlike in invHighC the products of green are subtracted, which rounds them the other way.
-Triple8 invHighD(Triple8 ycbcr)
+Triple<u8> invHighD(Triple<u8> ycbcr)
 {
     const s32 u = (ycbcr[1] - 128) * 128, v = (ycbcr[2] - 128) * 128;
     const s32 t = mulHighS16((ycbcr[0] - 16) * 128, 9535);

@@ -2,29 +2,24 @@
 // own.
 #pragma once
 
-#include "pyxcc/types.h"
-
-#include <array>
+#include "reference/pixels.hpp"
 
 namespace reference
 {
 
-/// The three samples of a pixel, in the order of its colour model.
-using Triple8 = std::array<u8, 3>;
-
 /// From R, G, B to Y, Cb, Cr.
-Triple8 fwdExact(Triple8 rgb);
-Triple8 fwdHigh(Triple8 rgb);
-Triple8 fwdRound(Triple8 rgb);
+Triple<u8> fwdExact(Triple<u8> rgb);
+Triple<u8> fwdHigh(Triple<u8> rgb);
+Triple<u8> fwdRound(Triple<u8> rgb);
 
 /// From Y, Cb, Cr to R, G, B.
-Triple8 invExactA(Triple8 ycbcr);
-Triple8 invExactB(Triple8 ycbcr);
-Triple8 invExactC(Triple8 ycbcr);
-Triple8 invExactD(Triple8 ycbcr);
-Triple8 invHighA(Triple8 ycbcr);
-Triple8 invHighB(Triple8 ycbcr);
-Triple8 invHighC(Triple8 ycbcr);
-Triple8 invHighD(Triple8 ycbcr);
+Triple<u8> invExactA(Triple<u8> ycbcr);
+Triple<u8> invExactB(Triple<u8> ycbcr);
+Triple<u8> invExactC(Triple<u8> ycbcr);
+Triple<u8> invExactD(Triple<u8> ycbcr);
+Triple<u8> invHighA(Triple<u8> ycbcr);
+Triple<u8> invHighB(Triple<u8> ycbcr);
+Triple<u8> invHighC(Triple<u8> ycbcr);
+Triple<u8> invHighD(Triple<u8> ycbcr);
 
 } // namespace reference

@@ -64,4 +64,7 @@ template <typename T> Image<T> planar(T* const* planes, int step, int count = 3)
     return image;
 }
 
+/// The same image with its first and third channel exchanged.
+template <typename T> Image<T> reversed(const Image<T>& image) { return {image[2], image[1], image[0], image[3]}; }
+
 } // namespace reference

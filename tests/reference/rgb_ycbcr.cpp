@@ -2,45 +2,10 @@
 
 #include "reference/arguments.hpp"
 #include "reference/bt601.hpp"
-#include "reference/image.hpp"
+#include "reference/pixels.hpp"
 
 namespace reference
 {
-
-namespace
-{
-
-using Form = Triple8 (*)(Triple8);
-
-/// The whole blocks of a row take the wide form, the pixels that are left take the tail form.
-void convert(const Image<const u8>& src, const Image<u8>& dst, RoiSize roi, int block, Form wide, Form tail)
-{
-    const int blocksEnd = roi.width / block * block;
-    for (int row = 0; row < roi.height; ++row) {
-        for (int column = 0; column < roi.width; ++column) {
-            const Form form = column < blocksEnd ? wide : tail;
-            const Triple8 pixel = form({src[0].get(row, column), src[1].get(row, column), src[2].get(row, column)});
-            for (int k = 0; k < 3; ++k) dst[k].set(row, column, pixel[k]);
-        }
-    }
-}
-
-void convert(const Image<const u8>& src, const Image<u8>& dst, RoiSize roi, Form form)
-{
-    convert(src, dst, roi, 1, form, form);
-}
-
-void fill(const Channel<u8>& dst, RoiSize roi, u8 value)
-{
-    for (int row = 0; row < roi.height; ++row) {
-        for (int column = 0; column < roi.width; ++column) dst.set(row, column, value);
-    }
-}
-
-/// The same samples with the first and the third channel exchanged.
-Image<u8> reversed(const Image<u8>& image) { return {image[2], image[1], image[0], image[3]}; }
-
-} // namespace
 
 PyxStatus pyxiRGBToYCbCr_8u_C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
