@@ -1,17 +1,119 @@
 #include "frame/plane_service.hpp"
+
+#include "layouts/avx2/interleave.hpp"
+#include "layouts/avx2/stream.hpp"
+#include "layouts/bytes.hpp"
+#include "pyxcc/core.h"
+
+#include <algorithm>
 #include <cstring>
+
 namespace pyxcc::frame
 {
+
+namespace
+{
+
+using layouts::rowAt;
+
+constexpr std::size_t line = 64; // bytes of a cache line
+
+/// The size of the largest cache in bytes, or 0 if it is not known.
+std::size_t largestCache()
+{
+    s32 size = 0;
+    return pyxGetMaxCacheSizeB(&size) == pyxOk ? static_cast<std::size_t>(size) : 0;
+}
+
+/// The bytes in front of the next line's start, but `count` at the most.
+std::size_t toNextLine(const u8* p, std::size_t count)
+{
+    return std::min((line - reinterpret_cast<std::uintptr_t>(p) % line) % line, count);
+}
+
+void streamRow(const u8* src, u8* dst, std::size_t count)
+{
+    const std::size_t head = toNextLine(dst, count);
+    std::memcpy(dst, src, head);
+    std::size_t x = head;
+    for (; count - x >= line; x += line) {
+        const wide::U8 first = layouts::loadSamples(src + x), second = layouts::loadSamples(src + x + line / 2);
+        layouts::streamSamples(dst + x, first);
+        layouts::streamSamples(dst + x + line / 2, second);
+    }
+    std::memcpy(dst + x, src + x, count - x);
+}
+
+void streamFill(u8 value, u8* dst, std::size_t count)
+{
+    const std::size_t head = toNextLine(dst, count);
+    std::memset(dst, value, head);
+    std::size_t x = head;
+    for (; count - x >= line; x += line) {
+        layouts::streamSamples(dst + x, wide::U8(value));
+        layouts::streamSamples(dst + x + line / 2, wide::U8(value));
+    }
+    std::memset(dst + x, value, count - x);
+}
+
+} // namespace
+
 PyxStatus copyPlane8u(const u8* src, int srcStep, u8* dst, int dstStep, int width, int height)
 {
     if (!src || !dst) return pyxErrNullPtr;
     if (width < 1 || height < 1) return pyxErrSize;
-    for (int y = 0; y < height; ++y)
-        std::memcpy(dst + static_cast<long>(y) * dstStep, src + static_cast<long>(y) * srcStep, width);
+
+    std::size_t rowBytes = static_cast<std::size_t>(width);
+    const std::size_t planeBytes = rowBytes * static_cast<std::size_t>(height);
+    int rows = height;
+    if (width == srcStep && width == dstStep) {
+        rowBytes = planeBytes;
+        rows = 1;
+    }
+
+    bool stream = false;
+    if (rowBytes >= line && planeBytes >= 0x100000) {
+        const std::size_t cache = largestCache();
+        stream = cache != 0 && planeBytes >= cache / 2;
+    }
+    for (int y = 0; y < rows; ++y) {
+        const u8* from = rowAt(src, srcStep, y);
+        u8* to = rowAt(dst, dstStep, y);
+        if (stream) {
+            streamRow(from, to, rowBytes);
+        } else {
+            std::memcpy(to, from, rowBytes);
+        }
+    }
+    if (stream) layouts::fenceStreams();
     return pyxOk;
 }
+
 void fillPlane8u(u8 value, u8* dst, int dstStep, int width, int height)
 {
-    for (int y = 0; y < height; ++y) std::memset(dst + static_cast<long>(y) * dstStep, value, width);
+    if (width < 1 || height < 1) return;
+    std::size_t rowBytes = static_cast<std::size_t>(width);
+    const std::size_t planeBytes = rowBytes * static_cast<std::size_t>(height);
+    int rows = height;
+    if (width == dstStep) {
+        rowBytes = planeBytes;
+        rows = 1;
+    }
+
+    bool stream = false;
+    if (planeBytes > 0x600000) {
+        const std::size_t cache = largestCache();
+        stream = cache != 0 && planeBytes >= cache;
+    }
+    for (int y = 0; y < rows; ++y) {
+        u8* to = rowAt(dst, dstStep, y);
+        if (stream) {
+            streamFill(value, to, rowBytes);
+        } else {
+            std::memset(to, value, rowBytes);
+        }
+    }
+    if (stream) layouts::fenceStreams();
 }
+
 } // namespace pyxcc::frame
