@@ -6,6 +6,7 @@
 #include "pyxcc/core.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <cstring>
 
 namespace pyxcc::frame
@@ -24,6 +25,20 @@ std::size_t largestCache()
     s32 size = 0;
     return pyxGetMaxCacheSizeB(&size) == pyxOk ? static_cast<std::size_t>(size) : 0;
 }
+
+/// The rows of a plane: a plane without gaps is one long row.
+struct Rows {
+    std::size_t bytes;
+    int count;
+
+    Rows(int width, int height, bool withoutGaps)
+        : bytes(static_cast<std::size_t>(width) * (withoutGaps ? static_cast<std::size_t>(height) : 1)),
+          count(withoutGaps ? 1 : height)
+    {
+    }
+
+    std::size_t planeBytes() const { return bytes * static_cast<std::size_t>(count); }
+};
 
 /// The bytes in front of the next line's start, but `count` at the most.
 std::size_t toNextLine(const u8* p, std::size_t count)
@@ -63,26 +78,19 @@ PyxStatus copyPlane8u(const u8* src, int srcStep, u8* dst, int dstStep, int widt
     if (!src || !dst) return pyxErrNullPtr;
     if (width < 1 || height < 1) return pyxErrSize;
 
-    std::size_t rowBytes = static_cast<std::size_t>(width);
-    const std::size_t planeBytes = rowBytes * static_cast<std::size_t>(height);
-    int rows = height;
-    if (width == srcStep && width == dstStep) {
-        rowBytes = planeBytes;
-        rows = 1;
-    }
-
+    const Rows rows(width, height, width == srcStep && width == dstStep);
     bool stream = false;
-    if (rowBytes >= line && planeBytes >= 0x100000) {
+    if (rows.bytes >= line && rows.planeBytes() >= 0x100000) {
         const std::size_t cache = largestCache();
-        stream = cache != 0 && planeBytes >= cache / 2;
+        stream = cache != 0 && rows.planeBytes() >= cache / 2;
     }
-    for (int y = 0; y < rows; ++y) {
+    for (int y = 0; y < rows.count; ++y) {
         const u8* from = rowAt(src, srcStep, y);
         u8* to = rowAt(dst, dstStep, y);
         if (stream) {
-            streamRow(from, to, rowBytes);
+            streamRow(from, to, rows.bytes);
         } else {
-            std::memcpy(to, from, rowBytes);
+            std::memcpy(to, from, rows.bytes);
         }
     }
     if (stream) layouts::fenceStreams();
@@ -92,25 +100,18 @@ PyxStatus copyPlane8u(const u8* src, int srcStep, u8* dst, int dstStep, int widt
 void fillPlane8u(u8 value, u8* dst, int dstStep, int width, int height)
 {
     if (width < 1 || height < 1) return;
-    std::size_t rowBytes = static_cast<std::size_t>(width);
-    const std::size_t planeBytes = rowBytes * static_cast<std::size_t>(height);
-    int rows = height;
-    if (width == dstStep) {
-        rowBytes = planeBytes;
-        rows = 1;
-    }
-
+    const Rows rows(width, height, width == dstStep);
     bool stream = false;
-    if (planeBytes > 0x600000) {
+    if (rows.planeBytes() > 0x600000) {
         const std::size_t cache = largestCache();
-        stream = cache != 0 && planeBytes >= cache;
+        stream = cache != 0 && rows.planeBytes() >= cache;
     }
-    for (int y = 0; y < rows; ++y) {
+    for (int y = 0; y < rows.count; ++y) {
         u8* to = rowAt(dst, dstStep, y);
         if (stream) {
-            streamFill(value, to, rowBytes);
+            streamFill(value, to, rows.bytes);
         } else {
-            std::memset(to, value, rowBytes);
+            std::memset(to, value, rows.bytes);
         }
     }
     if (stream) layouts::fenceStreams();
