@@ -145,6 +145,23 @@ TEST(YCbCrToRgb, PlanesToPixelsTakeTheHighFormInBlocksOf8)
     EXPECT_EQ(p3c3(pyxiYCbCrToRGB_8u_P3C3R, white, 9), Samples(24, 255) + Samples(3, 254));
 }
 
+// Blue of (19, 129, 128). In invHighD the luma term is 384 * 9535 >> 16 = 55 and that of Cb 128 * 16523 >> 16 = 32, so
+// that (55 + 32 + 8) >> 4 = 5; in invExactD 76282 * 19 + 132184 - 1187744 = 393798 is 6 * 65536 and a little. Red and
+// green are 3 in both.
+TEST(YCbCrToRgb, PlanesToPixelsWithAlphaTakeTheHighFormInBlocksOf8)
+{
+    constexpr Colour colour = {19, 129, 128};
+    EXPECT_EQ(p3c4(pyxiYCbCrToRGB_8u_P3C4R, colour, 7), repeated({3, 3, 6, 200}, 7));
+    EXPECT_EQ(p3c4(pyxiYCbCrToRGB_8u_P3C4R, colour, 8), repeated({3, 3, 5, 200}, 8));
+    EXPECT_EQ(p3c4(pyxiYCbCrToRGB_8u_P3C4R, colour, 9), repeated({3, 3, 5, 200}, 8) + repeated({3, 3, 6, 200}, 1));
+}
+
+TEST(YCbCrToRgb, BgrWithAlphaIsOfTheHighFormAtEveryWidth)
+{
+    for (int width = 1; width <= 40; ++width)
+        EXPECT_EQ(p3c4(pyxiYCbCrToBGR_8u_P3C4R, {19, 129, 128}, width), repeated({5, 3, 3, 200}, width)) << width;
+}
+
 TEST(YCbCrToRgb, AvalIsInEveryFourthByteOfTheTailToo)
 {
     for (const int width : {1, 7, 8, 9, 16, 23}) {
