@@ -1,0 +1,257 @@
+#include "support/scene.hpp"
+
+#include "support/compare.hpp"
+#include "support/expected_status.hpp"
+
+#include <algorithm>
+#include <cmath>
+#include <iterator>
+#include <sstream>
+
+namespace support
+{
+
+using catalog::Export;
+using catalog::Invocation;
+using catalog::Side;
+using catalog::Steps;
+
+namespace
+{
+
+std::string_view nameOf(Stride stride)
+{
+    constexpr std::string_view names[] = {"tight", "padded", "aligned", "odd", "tight up", "odd up", "zero"};
+    return names[static_cast<int>(stride)];
+}
+
+int roundUp(int value, int multiple) { return (value + multiple - 1) / multiple * multiple; }
+
+int stepFor(Stride stride, int rowBytes, int sampleBytes, Random& random)
+{
+    switch (stride) {
+    case Stride::tight:
+        break;
+    case Stride::padded:
+        return rowBytes + sampleBytes * random.between(1, 40);
+    case Stride::aligned:
+        return roundUp(rowBytes, 32) + 32 * random.between(0, 2);
+    case Stride::odd:
+        return rowBytes + random.between(1, 77);
+    case Stride::tightUp:
+        return -rowBytes;
+    case Stride::oddUp:
+        return -rowBytes - random.between(0, 77);
+    case Stride::zero:
+        return 0;
+    }
+    return rowBytes;
+}
+
+/// Room for rows at each other's steps as well.
+void shareExtent(Geometry& a, Geometry& b)
+{
+    a.low = b.low = std::min(a.low, b.low);
+    a.high = b.high = std::max(a.high, b.high);
+}
+
+std::vector<Geometry> geometriesOf(const Side& side, RoiSize roi, Stride stride, Random& random)
+{
+    const int sampleBytes = catalog::sizeOf(side.element);
+    std::vector<Geometry> geometries;
+    const int common = stepFor(stride, catalog::shapeOf(side, 0, roi).rowBytes, sampleBytes, random);
+    for (int plane = 0; plane < side.planes; ++plane) {
+        const catalog::PlaneShape shape = catalog::shapeOf(side, plane, roi);
+        const int step = side.steps == Steps::each   ? stepFor(stride, shape.rowBytes, sampleBytes, random)
+                         : side.steps == Steps::none ? shape.rowBytes
+                                                     : common;
+        geometries.push_back(geometryOf(shape, side.element, step));
+    }
+    // Some conversions walk a chroma plane by the step of the other one.
+    if (side.steps == Steps::each && side.planes > 2) shareExtent(geometries[1], geometries[2]);
+    return geometries;
+}
+
+Image makeImage(const Side& side, const Recipe& recipe, Stride stride, Random& random)
+{
+    const int sampleBytes = catalog::sizeOf(side.element);
+    Image image;
+    for (const Geometry& geometry : geometriesOf(side, recipe.roi, stride, random)) {
+        const int anywhere = random.between(0, 64 / sampleBytes - 1) * sampleBytes;
+        image.emplace_back(geometry, recipe.placement, recipe.aligned ? 0 : anywhere);
+    }
+    return image;
+}
+
+void hand(const Image& image, std::array<void*, 4>& planes, std::array<int, 4>& steps)
+{
+    for (std::size_t i = 0; i < image.size(); ++i) {
+        planes[i] = image[i].base();
+        steps[i] = image[i].geometry().step;
+    }
+}
+
+void describe(std::ostream& text, std::string_view role, Stride stride, const Image& image)
+{
+    text << "\n  " << role << ", rows " << nameOf(stride) << ":";
+    for (const Plane& plane : image) {
+        const auto address = reinterpret_cast<std::uintptr_t>(plane.base());
+        text << " step " << plane.geometry().step << " from " << address % 64 << " mod 64;";
+    }
+}
+
+/// Rows that cover each other are in order only where each row is a conversion of its own.
+bool rowsAreIndependent(const Export& entry) { return !entry.source.chromaY && !entry.target.chromaY; }
+
+catalog::Element elementOf(const catalog::ParameterType& type)
+{
+    int element = 0;
+    while (catalog::nameOf(static_cast<catalog::Element>(element)) != type.type) ++element;
+    return static_cast<catalog::Element>(element);
+}
+
+double numberFor(catalog::Range limits, catalog::Element element, Random& random)
+{
+    if (random.oneIn(4)) return random.oneIn(2) ? limits.low : limits.high;
+    const double number = random.real(limits.low, limits.high);
+    return element == catalog::Element::f32 || element == catalog::Element::f64 ? number : std::round(number);
+}
+
+} // namespace
+
+std::vector<Stride> sourceStrides(const Export& entry)
+{
+    std::vector<Stride> strides = {Stride::tight, Stride::padded, Stride::aligned, Stride::odd};
+    if (entry.traits.stepsTested) return strides;
+    strides.insert(strides.end(), {Stride::tightUp, Stride::oddUp});
+    if (!entry.inPlace) strides.push_back(Stride::zero);
+    return strides;
+}
+
+std::vector<Stride> targetStrides(const Export& entry)
+{
+    std::vector<Stride> strides = sourceStrides(entry);
+    std::erase(strides, Stride::zero);
+    if (entry.traits.stepsTested || entry.inPlace || !rowsAreIndependent(entry)) return strides;
+    strides.push_back(Stride::zero);
+    return strides;
+}
+
+RoiSize legalSize(const Export& entry, RoiSize roi)
+{
+    const catalog::Minimum& minimum = entry.traits.minimum;
+    return {roundUp(std::max(roi.width, minimum.width), minimum.widthMultiple),
+            roundUp(std::max(roi.height, minimum.height), minimum.heightMultiple)};
+}
+
+Scene::Scene(const Export& entry, const Recipe& recipe) : entry_(entry), recipe_(recipe)
+{
+    Random random(recipe.seed);
+    makeImages(random);
+    makeParameters(random);
+}
+
+void Scene::makeImages(Random& random)
+{
+    source_ = makeImage(entry_.source, recipe_, recipe_.sourceStride, random);
+    fillSamples(source_, entry_.source, entry_.traits.range, recipe_.pattern, random);
+    if (entry_.inPlace) {
+        target_ = std::move(source_);
+        source_.clear();
+    } else {
+        target_ = makeImage(entry_.target, recipe_, recipe_.targetStride, random);
+        fillBytes(target_, random);
+    }
+    pristineSource_ = source_;
+}
+
+void Scene::makeParameters(Random& random)
+{
+    for (int i = 0; i < entry_.parameterCount; ++i) {
+        const catalog::Parameter& parameter = entry_.traits.parameters[i];
+        const catalog::Element element = elementOf(entry_.parameterTypes[i]);
+        const catalog::Range limits = limitsOf(element, {parameter.low, parameter.high});
+        if (!entry_.parameterTypes[i].pointer) {
+            numbers_[i] = numberFor(limits, element, random);
+            continue;
+        }
+        const int bytes = parameter.count * catalog::sizeOf(element);
+        const Plane list(geometryOf({bytes, 1}, element, bytes), recipe_.placement, 0);
+        random.fill(list.all());
+        for (int k = 0; k < parameter.count; ++k) {
+            store(element, list.base() + k * catalog::sizeOf(element), numberFor(limits, element, random));
+        }
+        lists_[i].push_back(list);
+    }
+    pristineLists_ = lists_;
+}
+
+Invocation Scene::invocation(const Image& target) const
+{
+    Invocation call;
+    call.roi = recipe_.roi;
+    hand(entry_.inPlace ? target : source_, call.source, call.sourceStep);
+    if (!entry_.inPlace) hand(target, call.target, call.targetStep);
+    for (int i = 0; i < entry_.parameterCount; ++i) {
+        call.parameters[i].number = numbers_[i];
+        call.parameters[i].pointer = lists_[i].empty() ? nullptr : lists_[i][0].base();
+    }
+    return call;
+}
+
+std::optional<std::string> Scene::sourceDamage() const
+{
+    if (const auto text = support::firstDifference(pristineSource_, source_)) return "the source changed: " + *text;
+    for (std::size_t i = 0; i < lists_.size(); ++i) {
+        if (const auto text = support::firstDifference(pristineLists_[i], lists_[i])) {
+            return "parameter " + std::to_string(i) + " changed: " + *text;
+        }
+    }
+    return std::nullopt;
+}
+
+std::string Scene::text() const
+{
+    std::ostringstream text;
+    text << entry_.name << ", " << recipe_.roi.width << " x " << recipe_.roi.height << ", seed 0x" << std::hex
+         << recipe_.seed << std::dec << ", " << support::nameOf(recipe_.pattern) << " samples, images "
+         << support::nameOf(recipe_.placement);
+    if (!entry_.inPlace) describe(text, "source", recipe_.sourceStride, source_);
+    describe(text, entry_.inPlace ? "image" : "target", entry_.inPlace ? recipe_.sourceStride : recipe_.targetStride,
+             target_);
+    for (int i = 0; i < entry_.parameterCount; ++i) {
+        const catalog::Parameter& parameter = entry_.traits.parameters[i];
+        text << "\n  " << parameter.name << ":";
+        if (lists_[i].empty()) text << ' ' << numbers_[i];
+        for (int k = 0; !lists_[i].empty() && k < parameter.count; ++k) {
+            const catalog::Element element = elementOf(entry_.parameterTypes[i]);
+            text << ' ' << load(element, lists_[i][0].base() + k * catalog::sizeOf(element));
+        }
+    }
+    return text.str();
+}
+
+std::optional<std::string> firstDifference(const Subject& subject, const Scene& scene)
+{
+    const Image expected = scene.target(), actual = scene.target();
+    const Invocation call = scene.invocation(actual);
+    const PyxStatus wanted = subject.entry->call(subject.reference, scene.invocation(expected));
+    const PyxStatus found = subject.entry->call(subject.function, call);
+    const PyxStatus told = expectedStatus(*subject.entry, call);
+    std::ostringstream text;
+    if (found != wanted) {
+        text << "status " << found << ", but " << wanted << " from the reference";
+    } else if (found != told) {
+        text << "status " << found << ", but " << told << " by the catalogue";
+    } else if (const auto difference = firstDifference(expected, actual, subject.entry->traits.tolerance)) {
+        text << *difference;
+    } else if (const auto damage = scene.sourceDamage()) {
+        text << *damage;
+    } else {
+        return std::nullopt;
+    }
+    text << "\n  " << scene.text();
+    return text.str();
+}
+
+} // namespace support

@@ -1,0 +1,77 @@
+// A call of an export with all that it needs: images, steps and parameters.
+#pragma once
+
+#include "support/image.hpp"
+#include "support/samples.hpp"
+#include "support/subject.hpp"
+
+#include <cstdint>
+#include <optional>
+#include <string>
+
+namespace support
+{
+
+/// How far the rows of a plane lie apart.
+enum class Stride {
+    tight,
+    padded,
+    aligned, ///< a multiple of 32
+    odd,     ///< any number of bytes between rows, so that samples lie anywhere
+    tightUp, ///< the first row is the highest in memory
+    oddUp,
+    zero, ///< all rows in one place
+};
+
+struct Recipe {
+    std::uint64_t seed;
+    RoiSize roi;
+    Pattern pattern = Pattern::random;
+    Placement placement = Placement::margins;
+    Stride sourceStride = Stride::tight;
+    Stride targetStride = Stride::tight;
+    bool aligned = false; ///< all planes begin at multiples of 64
+};
+
+/// The strides that an export accepts.
+std::vector<Stride> sourceStrides(const catalog::Export& entry);
+std::vector<Stride> targetStrides(const catalog::Export& entry);
+
+/// The smallest size that the export accepts and that is not below `roi`.
+RoiSize legalSize(const catalog::Export& entry, RoiSize roi);
+
+class Scene
+{
+public:
+    Scene(const catalog::Export& entry, const Recipe& recipe);
+
+    /// The call that writes to `target`, a copy of target().
+    catalog::Invocation invocation(const Image& target) const;
+
+    /// What the target holds before the call: an in-place export's source, or random bytes.
+    const Image& target() const { return target_; }
+
+    /// What differs in the source or in the parameters from what they were at first.
+    std::optional<std::string> sourceDamage() const;
+
+    /// All that sets this call apart.
+    std::string text() const;
+
+private:
+    void makeImages(Random& random);
+    void makeParameters(Random& random);
+
+    const catalog::Export& entry_;
+    Recipe recipe_;
+    Image source_, pristineSource_;
+    Image target_;
+    std::array<double, 4> numbers_ = {};
+    std::array<Image, 4> lists_; ///< of parameters that are pointers: one plane, one row
+    std::array<Image, 4> pristineLists_;
+};
+
+/// Runs both functions of the subject on equal targets. Tells what differs between the statuses, the targets and what
+/// the catalogue and the scene promise; nothing if all is well.
+std::optional<std::string> firstDifference(const Subject& subject, const Scene& scene);
+
+} // namespace support
