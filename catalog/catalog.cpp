@@ -103,9 +103,18 @@ constexpr int blocks(int length, int shift, bool up) { return (length + (up ? (1
 std::span<const Check> checksOf(Order order)
 {
     using enum Check;
-    static constexpr Check elementsFirst[] = {pointers, elements, size, steps, parameters};
+    static constexpr Check usual[] = {pointers, elements, size, steps, parameters};
     static constexpr Check elementsLate[] = {pointers, size, elements, steps, parameters};
-    return order == Order::pointersSizeElements ? elementsLate : elementsFirst;
+    static constexpr Check parametersFirst[] = {parameters, pointers, elements, size, steps};
+    switch (order) {
+    case Order::pointersSizeElements:
+        return elementsLate;
+    case Order::parametersFirst:
+        return parametersFirst;
+    case Order::pointersElementsSize:
+        break;
+    }
+    return usual;
 }
 
 int sizeOf(Element element) { return elements[static_cast<int>(element)].second; }

@@ -41,6 +41,7 @@ const FamilyInfo& infoOf(Family family);
 enum class Order {
     pointersElementsSize,
     pointersSizeElements,
+    parametersFirst, ///< then as the first of these
 };
 
 /// What an order is made of. Steps and parameters are tested only where the traits say so.
@@ -70,6 +71,7 @@ struct Parameter {
     int count = 0;                        ///< 0 for a number
     std::array<double, 16> standard = {}; ///< a choice that does for most pictures
     PyxStatus status = pyxOk;             ///< what a number outside of them yields; pyxOk if that is not tested
+    bool aboveFront = false;              ///< what is tested is that it is above the parameter in front of it
 };
 
 inline constexpr Parameter aval{"aval", 0, 255, 0, {255}};
@@ -100,6 +102,7 @@ struct Traits {
     Range range = {};                         ///< of the source's samples
     double tolerance = 0;                     ///< by which a target sample may be off, where its last bit is left open
     bool followsRounding = false;             ///< an integer result depends on the caller's rounding mode
+    bool allocates = false;                   ///< takes scratch memory from the core library, for large images at least
 };
 
 enum class Arrangement {

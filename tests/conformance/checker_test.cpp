@@ -152,14 +152,12 @@ template <class F> Subject p3(F* function)
     return support::substitute("pyxiRGBToYCbCr_8u_P3R", reinterpret_cast<catalog::Function>(function));
 }
 
-TEST(Checker, AcceptsTheReference)
+TEST(Checker, AcceptsWhatIsRight)
 {
-    for (const Subject& subject : support::subjects()) {
-        const Subject itself{subject.entry, subject.reference, subject.reference};
+    for (const Subject& subject : {c3(right), p3(reference::pyxiRGBToYCbCr_8u_P3R)}) {
         for (const auto check : {conformance::checkValues, conformance::checkGuards, conformance::checkFaults,
                                  conformance::checkRounding}) {
-            const auto text = check(itself);
-            EXPECT_FALSE(text) << *text;
+            EXPECT_EQ(check(subject).value_or(""), "");
         }
     }
 }

@@ -79,6 +79,11 @@ void addParameters(Faults& faults, const Export& entry)
             faults.push_back({name + " null", [=](Invocation& call) { call.parameters[i].pointer = nullptr; }});
         }
         if (parameter.status == pyxOk) continue;
+        if (parameter.aboveFront) {
+            faults.push_back({name + " is not above what is in front of it",
+                              [=](Invocation& call) { call.parameters[i].number = call.parameters[i - 1].number; }});
+            continue;
+        }
         const bool isUnsigned = entry.parameterTypes[i].type.starts_with('u');
         for (const double value : {parameter.low - 1, parameter.high + 1}) {
             if (isUnsigned && value < 0) continue;

@@ -21,7 +21,7 @@ Failure checkGuards(const Subject& subject);
 /// Wrong arguments yield the status that comes first in the export's order, and nothing is written.
 Failure checkFaults(const Subject& subject);
 
-/// The caller's rounding mode stays as it is, and integers do not depend on it.
+/// The caller's rounding mode stays as it is. Floats follow it, integers do not depend on it.
 Failure checkRounding(const Subject& subject);
 
 } // namespace conformance

@@ -74,8 +74,9 @@ PyxStatus checkParameters(const Export& entry, const Invocation& call)
     for (int i = 0; i < entry.parameterCount; ++i) {
         const catalog::Parameter& parameter = entry.traits.parameters[i];
         const double number = call.parameters[i].number;
-        if (parameter.status != pyxOk && !(number >= parameter.low && number <= parameter.high))
-            return parameter.status;
+        const bool good = parameter.aboveFront ? number > call.parameters[i - 1].number
+                                               : number >= parameter.low && number <= parameter.high;
+        if (parameter.status != pyxOk && !good) return parameter.status;
     }
     return pyxOk;
 }
