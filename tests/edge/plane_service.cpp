@@ -1,4 +1,4 @@
-// The copy and the fill of whole planes, which the library hides. The cache size that the fill asks for is set here.
+// The copy and the fill of whole planes, which the library hides. The size of the cache that they ask for is set here.
 #include "frame/plane_service.hpp"
 
 #include "edge/samples.hpp"
@@ -16,17 +16,8 @@ namespace
 /// What pyxGetMaxCacheSizeB() tells; 0 for not known.
 s32 cacheSize = 0;
 
-} // namespace
-
-PyxStatus PYXCC_CALL pyxGetMaxCacheSizeB(s32* size)
-{
-    if (cacheSize == 0) return pyxErrBadArg;
-    *size = cacheSize;
-    return pyxOk;
-}
-
-namespace
-{
+/// Not known, too small for the large planes below, and large enough for them.
+constexpr s32 cacheSizes[] = {0, 0x100000, 0x10000000};
 
 Samples counted(std::size_t count)
 {
@@ -35,24 +26,14 @@ Samples counted(std::size_t count)
     return samples;
 }
 
-/// Fills a plane of 2501 by 2600, the least that may go past the cache, with 9 amid bytes of 77. Its rows start off
-/// every alignment.
-void expectLargeFillKeepsGaps()
-{
-    const int width = 2501, height = 2600, step = 2503;
-    static_assert(width * height > 0x600000);
-    Samples plane(1 + step * height, 77);
-    fillPlane8u(9, plane.data() + 1, step, width, height);
-
-    Samples expected(1, 77);
-    for (int j = 0; j < height; ++j) {
-        expected.insert(expected.end(), width, 9);
-        expected.insert(expected.end(), step - width, 77);
-    }
-    EXPECT_TRUE(plane == expected);
-}
-
 } // namespace
+
+PyxStatus PYXCC_CALL pyxGetMaxCacheSizeB(s32* size)
+{
+    if (cacheSize == 0) return pyxErrBadArg;
+    *size = cacheSize;
+    return pyxOk;
+}
 
 TEST(CopyPlane, WidthEqualToBothStepsIsOneRow)
 {
@@ -75,9 +56,12 @@ TEST(CopyPlane, LargePlaneIsOneRowToo)
     const int width = 1100, height = 1000;
     static_assert(width * height >= 0x100000);
     const Samples source = counted(width * height);
-    Samples target(width * height + 2, 77);
-    EXPECT_EQ(copyPlane8u(source.data(), width, target.data() + 1, width, width, height), pyxOk);
-    EXPECT_TRUE(target == Samples(1, 77) + source + Samples(1, 77));
+    for (const s32 size : cacheSizes) {
+        cacheSize = size;
+        Samples target(width * height + 2, 77);
+        EXPECT_EQ(copyPlane8u(source.data(), width, target.data() + 1, width, width, height), pyxOk);
+        EXPECT_TRUE(target == Samples(1, 77) + source + Samples(1, 77)) << size;
+    }
 }
 
 TEST(CopyPlane, GapBetweenRowsOfALargePlaneStays)
@@ -85,15 +69,17 @@ TEST(CopyPlane, GapBetweenRowsOfALargePlaneStays)
     const int width = 1101, height = 1000, step = 1103;
     static_assert(width * height >= 0x100000);
     const Samples source = counted(width * height);
-    Samples target(step * height, 77);
-    EXPECT_EQ(copyPlane8u(source.data(), width, target.data(), step, width, height), pyxOk);
-
     Samples expected;
     for (int j = 0; j < height; ++j) {
         expected.insert(expected.end(), source.begin() + j * width, source.begin() + (j + 1) * width);
         expected.insert(expected.end(), step - width, 77);
     }
-    EXPECT_TRUE(target == expected);
+    for (const s32 size : cacheSizes) {
+        cacheSize = size;
+        Samples target(step * height, 77);
+        EXPECT_EQ(copyPlane8u(source.data(), width, target.data(), step, width, height), pyxOk);
+        EXPECT_TRUE(target == expected) << size;
+    }
 }
 
 TEST(CopyPlane, NullOutranksSize)
@@ -112,22 +98,22 @@ TEST(FillPlane, GapBetweenRowsStays)
     EXPECT_EQ(plane, (Samples{9, 9, 9, 77, 77, 9, 9, 9, 77, 77}));
 }
 
-TEST(FillPlane, GapBetweenRowsStaysWhenTheCacheHoldsThePlane)
+TEST(FillPlane, GapBetweenRowsOfALargePlaneStays)
 {
-    cacheSize = 0x10000000;
-    expectLargeFillKeepsGaps();
-}
-
-TEST(FillPlane, GapBetweenRowsStaysWhenTheCacheIsTooSmall)
-{
-    cacheSize = 0x100000;
-    expectLargeFillKeepsGaps();
-}
-
-TEST(FillPlane, GapBetweenRowsStaysWhenTheCacheIsNotKnown)
-{
-    cacheSize = 0;
-    expectLargeFillKeepsGaps();
+    // The rows start off every alignment.
+    const int width = 2501, height = 2600, step = 2503;
+    static_assert(width * height > 0x600000);
+    Samples expected(1, 77);
+    for (int j = 0; j < height; ++j) {
+        expected.insert(expected.end(), width, 9);
+        expected.insert(expected.end(), step - width, 77);
+    }
+    for (const s32 size : cacheSizes) {
+        cacheSize = size;
+        Samples plane(1 + step * height, 77);
+        fillPlane8u(9, plane.data() + 1, step, width, height);
+        EXPECT_TRUE(plane == expected) << size;
+    }
 }
 
 TEST(FillPlane, WidthEqualToTheStepIsOneRow)
