@@ -7,34 +7,35 @@
 #include "frame/forms.hpp"
 #include "pyxcc/types.h"
 
+#include <array>
+#include <tuple>
+#include <utility>
+
 namespace pyxcc::frame
 {
 
-/// The columns [0, wide) take the wide form, [wide, end) the tail form; what lies behind is left alone.
-struct Spans {
-    int wide;
-    int end;
+/// Which columns take which form: a span ends where the next begins, and what lies behind the last is left alone. The
+/// rule takes the width and gives the ends of the spans, one a form, none below the one before it.
+template <class Rule, class... Forms> struct Plan {
+    Rule rule;
+    std::tuple<Forms...> forms;
 };
 
-/// What a row goes through: which columns, and which forms. The rule takes the width and gives Spans.
-template <class Rule, class Wide, class Tail> struct Plan {
-    Rule rule;
-    Wide wide;
-    Tail tail;
-};
+template <class Rule, class... Forms> constexpr auto spans(Rule rule, Forms... forms)
+{
+    return Plan<Rule, Forms...>{rule, {forms...}};
+}
 
 /// Whole blocks of `Block` pixels in the wide form, the rest in the tail form.
 template <int Block, class Wide, class Tail> constexpr auto wideThenTail(Wide wide, Tail tail)
 {
     static_assert((Block & (Block - 1)) == 0);
-    const auto rule = [](int width) { return Spans{width & ~(Block - 1), width}; };
-    return Plan<decltype(rule), Wide, Tail>{rule, wide, tail};
+    return spans([](int width) { return std::array{width & ~(Block - 1), width}; }, wide, tail);
 }
 
 template <class Form> constexpr auto everyPixel(Form form)
 {
-    const auto rule = [](int width) { return Spans{width, width}; };
-    return Plan<decltype(rule), Form, Form>{rule, form, form};
+    return spans([](int width) { return std::array{width}; }, form);
 }
 
 /// Takes the columns [from, to) of a row through a form: whole blocks, then what is left as one partial block, which
@@ -49,16 +50,20 @@ PYXCC_INLINE void convertColumns(const Source& source, const Target& target, int
     if (x < to) target.store(x, to - x, apply(form, source.load(x, to - x)));
 }
 
-template <class Source, class Target, class Rule, class Wide, class Tail>
+template <class Source, class Target, class Rule, class... Forms>
 PYXCC_INLINE void convertRows(int width, int rows, const Source& sourceRow, const Target& targetRow,
-                              const Plan<Rule, Wide, Tail>& plan)
+                              const Plan<Rule, Forms...>& plan)
 {
-    const Spans spans = plan.rule(width);
+    const auto ends = plan.rule(width);
+    static_assert(std::tuple_size_v<decltype(ends)> == sizeof...(Forms));
     for (int y = 0; y < rows; ++y) {
         const auto source = sourceRow(y);
         const auto target = targetRow(y);
-        convertColumns(source, target, 0, spans.wide, plan.wide);
-        if (spans.wide < spans.end) convertColumns(source, target, spans.wide, spans.end, plan.tail);
+        [&]<std::size_t... I>(std::index_sequence<I...>) PYXCC_INLINE_LAMBDA
+        {
+            (convertColumns(source, target, I ? ends[I - 1] : 0, ends[I], std::get<I>(plan.forms)), ...);
+        }
+        (std::index_sequence_for<Forms...>{});
     }
 }
 
@@ -67,7 +72,8 @@ template <class Source, class Target, class Plan>
 PYXCC_INLINE PyxStatus eachRow(RoiSize roi, const Source& source, const Target& target, const Plan& plan)
 {
     convertRows(
-        roi.width, roi.height, [&](int y) { return source.row(y); }, [&](int y) { return target.row(y); }, plan);
+        roi.width, roi.height, [&](int y) PYXCC_INLINE_LAMBDA { return source.row(y); },
+        [&](int y) PYXCC_INLINE_LAMBDA { return target.row(y); }, plan);
     return pyxOk;
 }
 
@@ -76,8 +82,8 @@ template <class Source, class Target, class Plan>
 PYXCC_INLINE PyxStatus eachRowPair(RoiSize roi, const Source& source, const Target& target, const Plan& plan)
 {
     convertRows(
-        roi.width, roi.height >> 1, [&](int j) { return source.rowPair(j); }, [&](int j) { return target.rowPair(j); },
-        plan);
+        roi.width, roi.height >> 1, [&](int j) PYXCC_INLINE_LAMBDA { return source.rowPair(j); },
+        [&](int j) PYXCC_INLINE_LAMBDA { return target.rowPair(j); }, plan);
     return pyxOk;
 }
 

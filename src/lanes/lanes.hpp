@@ -4,5 +4,4 @@
 #include "lanes/avx2/exact_sum.hpp"
 #include "lanes/avx2/floats.hpp"
 #include "lanes/avx2/integers.hpp"
-#include "lanes/exact_sum.hpp"
 #include "lanes/scalar.hpp"

@@ -57,6 +57,12 @@ inline S16 addSatS16(S16 x, S16 y) { return std::clamp(x.v + y.v, -32768, 32767)
 inline S16 subSatS16(S16 x, S16 y) { return std::clamp(x.v - y.v, -32768, 32767); }
 inline U16 addSatU16(U16 x, U16 y) { return std::min(x.v + y.v, 65535); }
 
+/// (Weights * lanes + ... + Addend) >> Shift in 32 bits, of which the low 16 are kept.
+template <int Shift, int Addend, int... Weights, class... Lanes> S16 exactSum(const Lanes&... lanes)
+{
+    return (Addend + ... + (Weights * lanes.v)) >> Shift;
+}
+
 inline f32 fused(f32 x, f32 y, f32 z) { return std::fma(x, y, z); }
 inline f64 fused(f64 x, f64 y, f64 z) { return std::fma(x, y, z); }
 

@@ -15,10 +15,9 @@ namespace pyxcc::matrix
 struct FwdExact : frame::OnWords {
     template <class Word> PYXCC_INLINE auto operator()(const Word& R, const Word& G, const Word& B) const
     {
-        const auto r = exact(R), g = exact(G), b = exact(B);
-        return Three{low8((16843 * r + 33030 * g + 6423 * b + 0x108000) >> 16),
-                     low8((-9699 * r - 19071 * g + 28770 * b - 0x7f8000) >> 16),
-                     low8((28770 * r - 24117 * g - 4653 * b - 0x7f8000) >> 16)};
+        return Three{low8(exactSum<16, 0x108000, 16843, 33030, 6423>(R, G, B)),
+                     low8(exactSum<16, -0x7f8000, -9699, -19071, 28770>(R, G, B)),
+                     low8(exactSum<16, -0x7f8000, 28770, -24117, -4653>(R, G, B))};
     }
 };
 
@@ -56,10 +55,10 @@ struct InvExactWeights {
 template <InvExactWeights k> struct InvExact : frame::OnWords {
     template <class Word> PYXCC_INLINE auto operator()(const Word& Y, const Word& Cb, const Word& Cr) const
     {
-        const auto y = exact(Y), cb = exact(Cb - 128), cr = exact(Cr - 128);
-        return Three{sat8((k.y * y + k.crToR * cr + k.addend) >> 16),
-                     sat8((k.y * y + k.cbToG * cb + k.crToG * cr + k.addend) >> 16),
-                     sat8((k.y * y + k.cbToB * cb + k.addend) >> 16)};
+        const auto cb = Cb - 128, cr = Cr - 128;
+        return Three{sat8(exactSum<16, k.addend, k.y, k.crToR>(Y, cr)),
+                     sat8(exactSum<16, k.addend, k.y, k.cbToG, k.crToG>(Y, cb, cr)),
+                     sat8(exactSum<16, k.addend, k.y, k.cbToB>(Y, cb))};
     }
 };
 

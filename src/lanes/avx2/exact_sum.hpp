@@ -1,8 +1,7 @@
-// Exact sums over registers of words, by multiply-add pairs.
+// Exact weighted sums over registers of words, by multiply-add pairs.
 #pragma once
 
 #include "lanes/avx2/integers.hpp"
-#include "lanes/exact_sum.hpp"
 
 namespace pyxcc::wide
 {
@@ -10,68 +9,88 @@ namespace pyxcc::wide
 namespace detail
 {
 
-/// A weight beyond 16 bits is taken apart as whole << shift plus a rest that a multiply-add takes: the whole part
-/// adds multiples of the lane to the shifted sum, without rounding, since they are multiples of 1 << shift before it.
+/// A weight beyond 16 bits is taken apart as (whole << shift) + rest, of which a multiply-add takes the rest. The whole
+/// part adds multiples of the lane to the shifted sum; nothing is rounded by that, since before the shift they are
+/// multiples of 1 << shift.
 struct SplitWeight {
     int whole;
     int rest;
 
-    PYXCC_INLINE SplitWeight(int weight, int shift)
+    constexpr SplitWeight(int weight, int shift)
+        : whole(weight >= -32768 && weight <= 32767 ? 0 : (weight + (1 << (shift - 1))) >> shift),
+          rest(weight - whole * (1 << shift))
     {
-        const bool fits = weight >= -32768 && weight <= 32767;
-        whole = fits ? 0 : (weight + (1 << (shift - 1))) >> shift;
-        rest = weight - whole * (1 << shift);
     }
 };
 
-PYXCC_INLINE S16 times(S16 x, int whole)
+/// A power of two of which the addend is a multiple by a factor of 16 bits, or 0 if there is none. The addend can then
+/// ride in the free half of the last pair.
+constexpr int unitOf(int addend)
 {
-    if (whole == 1) return x;
-    if (whole == 2) return x + x;
-    if (whole == -1) return S16(0) - x;
-    return x * S16(whole);
+    for (int unit = 1 << 14; unit > 1; unit >>= 1) {
+        const int factor = addend / unit;
+        if (addend % unit == 0 && factor >= -32768 && factor <= 32767) return unit;
+    }
+    return 0;
 }
 
-/// A power of two whose multiple the addend is by a factor of 16 bits, or 0: the addend then rides on the free half of
-/// the last pair.
-PYXCC_INLINE int unitOf(int addend)
+/// Running sums of the low and of the high half of the words.
+struct Sums {
+    __m256i low, high;
+
+    template <int WeightOfX, int WeightOfY> PYXCC_INLINE void add(const S16& x, const S16& y)
+    {
+        static_assert(WeightOfX >= -32768 && WeightOfX <= 32767 && WeightOfY >= -32768 && WeightOfY <= 32767);
+        const __m256i weights = _mm256_set1_epi32((WeightOfX & 0xffff) | static_cast<int>(WeightOfY * 0x10000u));
+        low = _mm256_add_epi32(low, _mm256_madd_epi16(_mm256_unpacklo_epi16(x.v, y.v), weights));
+        high = _mm256_add_epi32(high, _mm256_madd_epi16(_mm256_unpackhi_epi16(x.v, y.v), weights));
+    }
+};
+
+template <int Shift, int Addend, int Weight> PYXCC_INLINE void addTerms(Sums& sums, const S16& x)
 {
-    if (addend == 0) return 0;
-    const int zeros = __builtin_ctz(static_cast<unsigned>(addend));
-    const int unit = 1 << (zeros < 14 ? zeros : 14);
-    const int factor = addend / unit;
-    return factor >= -32768 && factor <= 32767 ? unit : 0;
+    constexpr SplitWeight weight(Weight, Shift);
+    constexpr int unit = unitOf(Addend);
+    if constexpr (unit == 0) {
+        sums.add<weight.rest, 0>(x, S16(0));
+    } else {
+        sums.add<weight.rest, Addend / unit>(x, S16(unit));
+    }
 }
 
-PYXCC_INLINE __m256i weightPair(int even, int odd)
+template <int Shift, int Addend, int WeightOfX, int WeightOfY, int... Weights, class... Lanes>
+PYXCC_INLINE void addTerms(Sums& sums, const S16& x, const S16& y, const Lanes&... rest)
 {
-    return _mm256_set1_epi32(static_cast<int>((static_cast<u32>(odd) << 16) | (static_cast<u32>(even) & 0xffff)));
+    constexpr SplitWeight first(WeightOfX, Shift), second(WeightOfY, Shift);
+    sums.add<first.rest, second.rest>(x, y);
+    if constexpr (sizeof...(rest) > 0) addTerms<Shift, Addend, Weights...>(sums, rest...);
+}
+
+/// What the whole part of a weight adds to the shifted sum.
+template <int Shift, int Weight> PYXCC_INLINE void addWhole(S16& sum, const S16& x)
+{
+    constexpr int whole = SplitWeight(Weight, Shift).whole;
+    if constexpr (whole == 1) sum = sum + x;
+    if constexpr (whole == -1) sum = sum - x;
+    if constexpr (whole == 2) sum = sum + (x + x);
+    if constexpr (whole > 2 || whole < -1) sum = sum + x * S16(whole);
 }
 
 } // namespace detail
 
-PYXCC_INLINE Exact<S16> exact(const Sample& x) { return {x}; }
-
-template <std::size_t N> PYXCC_INLINE S16 shiftedSum(const ExactSum<S16, N>& sum, int shift)
+/// (Weights * lanes + ... + Addend) >> Shift with exact products and sums. The sum must keep within 32 bits and the
+/// shifted sum within 16.
+template <int Shift, int Addend, int... Weights, class... Lanes> PYXCC_INLINE S16 exactSum(const Lanes&... lanes)
 {
-    const int unit = N % 2 == 1 ? detail::unitOf(sum.addend) : 0;
-    __m256i low = _mm256_set1_epi32(unit ? 0 : sum.addend);
-    __m256i high = low;
-    S16 whole = 0;
-    for (std::size_t i = 0; i < N; i += 2) {
-        const bool paired = i + 1 < N;
-        const detail::SplitWeight even(sum.terms[i].weight, shift);
-        const detail::SplitWeight odd(paired ? sum.terms[i + 1].weight : 0, shift);
-        const int oddFactor = paired ? odd.rest : unit ? sum.addend / unit : 0;
-        const __m256i partner = paired ? sum.terms[i + 1].x.v : _mm256_set1_epi16(static_cast<short>(unit));
-        const __m256i weights = detail::weightPair(even.rest, oddFactor);
-        const __m256i x = sum.terms[i].x.v;
-        low = _mm256_add_epi32(low, _mm256_madd_epi16(_mm256_unpacklo_epi16(x, partner), weights));
-        high = _mm256_add_epi32(high, _mm256_madd_epi16(_mm256_unpackhi_epi16(x, partner), weights));
-        if (even.whole) whole = whole + detail::times(sum.terms[i].x, even.whole);
-        if (paired && odd.whole) whole = whole + detail::times(sum.terms[i + 1].x, odd.whole);
-    }
-    return S16(_mm256_packs_epi32(_mm256_srai_epi32(low, shift), _mm256_srai_epi32(high, shift))) + whole;
+    static_assert(sizeof...(Weights) == sizeof...(Lanes));
+    // An addend that finds no free half starts the sums.
+    constexpr bool rides = sizeof...(Weights) % 2 == 1 && detail::unitOf(Addend) != 0;
+    const __m256i start = _mm256_set1_epi32(rides ? 0 : Addend);
+    detail::Sums sums{start, start};
+    detail::addTerms<Shift, rides ? Addend : 0, Weights...>(sums, lanes...);
+    S16 result(_mm256_packs_epi32(_mm256_srai_epi32(sums.low, Shift), _mm256_srai_epi32(sums.high, Shift)));
+    (detail::addWhole<Shift, Weights>(result, lanes), ...);
+    return result;
 }
 
 } // namespace pyxcc::wide
