@@ -1,0 +1,92 @@
+// Shared chroma: what stands between 32 pixels and the 16 samples that pairs of them share.
+#pragma once
+
+#include "layouts/avx2/interleave.hpp"
+
+namespace pyxcc::layouts
+{
+
+/// 16 samples of 8 bits.
+struct HalfBlock {
+    static constexpr int count = 16;
+    __m128i v;
+};
+
+/// The samples of two chroma components, 16 of each.
+using ChromaPairs = Two<HalfBlock>;
+
+PYXCC_INLINE HalfBlock loadHalf(const u8* p) { return {_mm_loadu_si128(reinterpret_cast<const __m128i*>(p))}; }
+PYXCC_INLINE void storeHalf(u8* p, HalfBlock x) { _mm_storeu_si128(reinterpret_cast<__m128i*>(p), x.v); }
+
+/// As words, in order.
+PYXCC_INLINE wide::Sample widen(HalfBlock x)
+{
+    const __m256i words = _mm256_cvtepu8_epi16(x.v);
+    return {wide::S16(words), wide::U16(_mm256_slli_epi16(words, 8))};
+}
+
+PYXCC_INLINE HalfBlock narrowHalf(wide::Byte x)
+{
+    return {_mm_packus_epi16(_mm256_castsi256_si128(x.v), _mm256_extracti128_si256(x.v, 1))};
+}
+
+/// Each sum of two neighbours, in order.
+PYXCC_INLINE wide::S16 pairSums(wide::U8 x) { return wide::S16(_mm256_maddubs_epi16(x.v, _mm256_set1_epi8(1))); }
+
+/// Each word twice, in the order of widened bytes: what 16 chroma samples give is laid beside 32 luma samples.
+PYXCC_INLINE Two<wide::S16> doubled(wide::S16 x)
+{
+    return {wide::S16(_mm256_unpacklo_epi16(x.v, x.v)), wide::S16(_mm256_unpackhi_epi16(x.v, x.v))};
+}
+
+/// Each byte twice, in order.
+PYXCC_INLINE wide::U8 doubled(HalfBlock x)
+{
+    const __m128i low = _mm_unpacklo_epi8(x.v, x.v), high = _mm_unpackhi_epi8(x.v, x.v);
+    return wide::U8(_mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1));
+}
+
+namespace detail
+{
+
+/// Even bytes, then odd ones, in each lane.
+constexpr Places evensThenOdds = {0, 2, 4, 6, 8, 10, 12, 14, 1, 3, 5, 7, 9, 11, 13, 15};
+
+/// 64-bit quarters 0 2 1 3: brings what both lanes hold of two things together.
+PYXCC_INLINE __m256i swapMiddle(__m256i x) { return _mm256_permute4x64_epi64(x, 0xd8); }
+
+} // namespace detail
+
+/// 16 interleaved pairs, taken apart.
+PYXCC_INLINE ChromaPairs splitPairs(wide::U8 x)
+{
+    const __m256i apart = detail::swapMiddle(detail::shuffle(x.v, detail::evensThenOdds));
+    return {{_mm256_castsi256_si128(apart)}, {_mm256_extracti128_si256(apart, 1)}};
+}
+
+/// Interleaves the samples of two components.
+PYXCC_INLINE wide::U8 joinPairs(const ChromaPairs& x)
+{
+    const __m128i low = _mm_unpacklo_epi8(x.a.v, x.b.v), high = _mm_unpackhi_epi8(x.a.v, x.b.v);
+    return wide::U8(_mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1));
+}
+
+/// The even and the odd bytes of 64: luma and chroma of packed 4:2:2.
+PYXCC_INLINE Two<wide::U8> loadAlternating(const u8* p)
+{
+    const __m256i first = detail::loadWhole(p), second = detail::loadWhole(p + 32);
+    const __m256i low = _mm256_set1_epi16(255);
+    const __m256i even = _mm256_packus_epi16(_mm256_and_si256(first, low), _mm256_and_si256(second, low));
+    const __m256i odd = _mm256_packus_epi16(_mm256_srli_epi16(first, 8), _mm256_srli_epi16(second, 8));
+    return {wide::U8(detail::swapMiddle(even)), wide::U8(detail::swapMiddle(odd))};
+}
+
+/// Writes 64 bytes, the even ones from `even`.
+PYXCC_INLINE void storeAlternating(u8* p, wide::U8 even, wide::U8 odd)
+{
+    const __m256i low = _mm256_unpacklo_epi8(even.v, odd.v), high = _mm256_unpackhi_epi8(even.v, odd.v);
+    detail::storeWhole(p, _mm256_permute2x128_si256(low, high, 0x20));
+    detail::storeWhole(p + 32, _mm256_permute2x128_si256(low, high, 0x31));
+}
+
+} // namespace pyxcc::layouts
