@@ -1,6 +1,9 @@
 // The plain statement of every conversion: scalar, one pixel at a time, under the name and the signature of the export.
 #pragma once
 
+#include "reference/bt709.hpp"
 #include "reference/color_twist.hpp"
 #include "reference/gamma.hpp"
+#include "reference/rgb_to_subsampled.hpp"
 #include "reference/rgb_ycbcr.hpp"
+#include "reference/subsampled_to_rgb.hpp"
