@@ -4,6 +4,8 @@
 
 #include "layouts/rows.hpp"
 
+#include <type_traits>
+
 namespace pyxcc::layouts
 {
 
@@ -15,32 +17,59 @@ template <class Packing, class Byte> struct InterleavedImage {
     PYXCC_INLINE auto row(int y) const { return InterleavedRow<Packing, Byte>{rowAt(first, step, y), packing}; }
 };
 
-template <int Count, class Byte> struct PlanarImage {
+template <class Samples, int Count, class Byte> struct PlanarImage {
     std::array<Byte*, Count> first;
     std::array<std::ptrdiff_t, Count> step;
 
     PYXCC_INLINE auto row(int y) const
     {
-        PlanarRow<Count, Byte> row;
+        PlanarRow<Samples, Count, Byte> row;
         for (int i = 0; i < Count; ++i) row.at[i] = rowAt(first[i], step[i], y);
         return row;
     }
 };
 
-inline auto c3(const u8* first, int step) { return InterleavedImage<C3, const u8>{first, step, {}}; }
-inline auto c3(u8* first, int step) { return InterleavedImage<C3, u8>{first, step, {}}; }
+namespace detail
+{
+
+template <class Sample> using RegisterOf = wide::RegisterOf<std::remove_const_t<Sample>>;
+template <class Sample> using ByteOf = std::conditional_t<std::is_const_v<Sample>, const u8, u8>;
+
+template <class Packing, class Sample> auto interleaved(Sample* first, int step, const Packing& packing)
+{
+    return InterleavedImage<Packing, ByteOf<Sample>>{bytes(first), step, packing};
+}
+
+} // namespace detail
+
+template <class Sample> auto c3(Sample* first, int step)
+{
+    return detail::interleaved(first, step, C3<detail::RegisterOf<Sample>>{});
+}
 
 /// Four channels, of which the first three take part: a target keeps its fourth.
-inline auto ac4(const u8* first, int step) { return InterleavedImage<AC4, const u8>{first, step, {}}; }
-inline auto ac4(u8* first, int step) { return InterleavedImage<AC4, u8>{first, step, {}}; }
+template <class Sample> auto ac4(Sample* first, int step)
+{
+    return detail::interleaved(first, step, AC4<detail::RegisterOf<Sample>>{});
+}
+
+/// Four channels, all of which take part.
+template <class Sample> auto c4(Sample* first, int step)
+{
+    return detail::interleaved(first, step, C4<detail::RegisterOf<Sample>>{});
+}
 
 /// A target whose fourth channel is set.
-inline auto c4(u8* first, int step, u8 fourth) { return InterleavedImage<C4Set, u8>{first, step, {fourth}}; }
+template <class Sample> auto c4(Sample* first, int step, std::type_identity_t<Sample> fourth)
+{
+    return detail::interleaved(first, step, C4Set<detail::RegisterOf<Sample>>{fourth});
+}
 
 /// Three planes with one step.
-template <class Byte> auto p3(Byte* const planes[3], int step)
+template <class Sample> auto p3(Sample* const planes[3], int step)
 {
-    return PlanarImage<3, Byte>{{planes[0], planes[1], planes[2]}, {step, step, step}};
+    return PlanarImage<detail::RegisterOf<Sample>, 3, detail::ByteOf<Sample>>{
+        {bytes(planes[0]), bytes(planes[1]), bytes(planes[2])}, {step, step, step}};
 }
 
 /// The same image with its channels in reverse order, B G R for R G B.

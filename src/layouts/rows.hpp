@@ -1,7 +1,7 @@
 // Rows: blocks of pixels loaded and stored by their first column, whole or in part.
 //
-// A partial block passes through a buffer of a whole one, cleared first, so that nothing beyond the row is read or
-// written and the lanes without a pixel compute on zeros.
+// A block is as many pixels as a register holds samples. A partial block passes through a buffer of a whole one,
+// cleared first, so that nothing beyond the row is read or written and the lanes without a pixel compute on zeros.
 #pragma once
 
 #include "layouts/avx2/interleave.hpp"
@@ -12,55 +12,69 @@
 namespace pyxcc::layouts
 {
 
-/// Three interleaved bytes a pixel.
-struct C3 {
-    static constexpr int pixelBytes = 3;
+/// Three interleaved samples a pixel.
+template <class Register> struct C3 {
+    using Samples = Register;
+    static constexpr int pixelBytes = 3 * sampleBytes<Samples>;
     static constexpr bool readsTarget = false;
 
-    static PYXCC_INLINE Three<wide::U8> load(const u8* p) { return loadTriples(p); }
-    static PYXCC_INLINE void store(u8* p, const Three<wide::U8>& pixels) { storeTriples(p, pixels); }
+    static PYXCC_INLINE Three<Samples> load(const u8* p) { return loadTriples<Samples>(p); }
+    static PYXCC_INLINE void store(u8* p, const Three<Samples>& pixels) { storeTriples(p, pixels); }
 };
 
-/// Four interleaved bytes a pixel, the fourth not taking part: a store puts it back as it was.
-struct AC4 {
-    static constexpr int pixelBytes = 4;
+/// Four interleaved samples a pixel, the fourth not taking part: a store puts it back as it was.
+template <class Register> struct AC4 {
+    using Samples = Register;
+    static constexpr int pixelBytes = 4 * sampleBytes<Samples>;
     static constexpr bool readsTarget = true;
 
-    static PYXCC_INLINE Three<wide::U8> load(const u8* p)
+    static PYXCC_INLINE Three<Samples> load(const u8* p)
     {
-        const Four<wide::U8> pixels = loadQuadruples(p);
+        const Four<Samples> pixels = loadQuadruples<Samples>(p);
         return {pixels.a, pixels.b, pixels.c};
     }
-    static PYXCC_INLINE void store(u8* p, const Three<wide::U8>& pixels) { storeTriplesOfQuadruples(p, pixels); }
+    static PYXCC_INLINE void store(u8* p, const Three<Samples>& pixels) { storeTriplesOfQuadruples(p, pixels); }
 };
 
-/// Four interleaved bytes a pixel, the fourth set.
-struct C4Set {
-    static constexpr int pixelBytes = 4;
+/// Four interleaved samples a pixel, all of which take part.
+template <class Register> struct C4 {
+    using Samples = Register;
+    static constexpr int pixelBytes = 4 * sampleBytes<Samples>;
     static constexpr bool readsTarget = false;
-    u8 fourth;
 
-    PYXCC_INLINE void store(u8* p, const Three<wide::U8>& pixels) const
+    static PYXCC_INLINE Four<Samples> load(const u8* p) { return loadQuadruples<Samples>(p); }
+    static PYXCC_INLINE void store(u8* p, const Four<Samples>& pixels) { storeQuadruples(p, pixels); }
+};
+
+/// Four interleaved samples a pixel, the fourth set.
+template <class Register> struct C4Set {
+    using Samples = Register;
+    static constexpr int pixelBytes = 4 * sampleBytes<Samples>;
+    static constexpr bool readsTarget = false;
+    Samples fourth;
+
+    PYXCC_INLINE void store(u8* p, const Three<Samples>& pixels) const
     {
-        storeQuadruples(p, {pixels.a, pixels.b, pixels.c, wide::U8(fourth)});
+        storeQuadruples(p, Four<Samples>{pixels.a, pixels.b, pixels.c, fourth});
     }
 };
 
 /// A packing with its three channels in reverse order.
 template <class Packing> struct Reversed {
+    using Samples = typename Packing::Samples;
     static constexpr int pixelBytes = Packing::pixelBytes;
     static constexpr bool readsTarget = Packing::readsTarget;
     Packing packing;
 
-    PYXCC_INLINE Three<wide::U8> load(const u8* p) const { return reverse(packing.load(p)); }
-    PYXCC_INLINE void store(u8* p, const Three<wide::U8>& pixels) const { packing.store(p, reverse(pixels)); }
+    PYXCC_INLINE Three<Samples> load(const u8* p) const { return reverse(packing.load(p)); }
+    PYXCC_INLINE void store(u8* p, const Three<Samples>& pixels) const { packing.store(p, reverse(pixels)); }
 
 private:
-    static PYXCC_INLINE Three<wide::U8> reverse(const Three<wide::U8>& x) { return {x.c, x.b, x.a}; }
+    static PYXCC_INLINE Three<Samples> reverse(const Three<Samples>& x) { return {x.c, x.b, x.a}; }
 };
 
 template <class Packing, class Byte> struct InterleavedRow {
-    static constexpr int block = wide::U8::count;
+    static constexpr int block = Packing::Samples::count;
     static constexpr int pixelBytes = Packing::pixelBytes;
     Byte* at;
     Packing packing;
@@ -91,48 +105,54 @@ private:
     PYXCC_INLINE Byte* pixel(int x) const { return at + static_cast<std::ptrdiff_t>(x) * pixelBytes; }
 };
 
-/// A row of each of several planes of bytes, all of one width.
-template <int Count, class Byte> struct PlanarRow {
-    static constexpr int block = wide::U8::count;
+/// A row of each of several planes of samples, all of one width.
+template <class Samples, int Count, class Byte> struct PlanarRow {
+    static constexpr int block = Samples::count;
     std::array<Byte*, Count> at;
 
-    PYXCC_INLINE Three<wide::U8> load(int x) const
+    PYXCC_INLINE Three<Samples> load(int x) const
     {
-        return {loadSamples(at[0] + x), loadSamples(at[1] + x), loadSamples(at[2] + x)};
+        return {loadSamples<Samples>(sample(0, x)), loadSamples<Samples>(sample(1, x)),
+                loadSamples<Samples>(sample(2, x))};
     }
 
-    PYXCC_INLINE Three<wide::U8> load(int x, int count) const
+    PYXCC_INLINE Three<Samples> load(int x, int count) const
     {
-        return {loadPart(at[0] + x, count), loadPart(at[1] + x, count), loadPart(at[2] + x, count)};
+        return {loadPart(sample(0, x), count), loadPart(sample(1, x), count), loadPart(sample(2, x), count)};
     }
 
-    PYXCC_INLINE void store(int x, const Three<wide::U8>& pixels) const
+    PYXCC_INLINE void store(int x, const Three<Samples>& pixels) const
     {
-        storeSamples(at[0] + x, pixels.a);
-        storeSamples(at[1] + x, pixels.b);
-        storeSamples(at[2] + x, pixels.c);
+        storeSamples(sample(0, x), pixels.a);
+        storeSamples(sample(1, x), pixels.b);
+        storeSamples(sample(2, x), pixels.c);
     }
 
-    PYXCC_INLINE void store(int x, int count, const Three<wide::U8>& pixels) const
+    PYXCC_INLINE void store(int x, int count, const Three<Samples>& pixels) const
     {
-        storePart(at[0] + x, count, pixels.a);
-        storePart(at[1] + x, count, pixels.b);
-        storePart(at[2] + x, count, pixels.c);
+        storePart(sample(0, x), count, pixels.a);
+        storePart(sample(1, x), count, pixels.b);
+        storePart(sample(2, x), count, pixels.c);
     }
 
 private:
-    static PYXCC_INLINE wide::U8 loadPart(const u8* p, int count)
+    PYXCC_INLINE Byte* sample(int plane, int x) const
     {
-        alignas(32) u8 buffer[block] = {};
-        copyBytes(buffer, p, count);
-        return loadSamples(buffer);
+        return at[plane] + static_cast<std::ptrdiff_t>(x) * sampleBytes<Samples>;
     }
 
-    static PYXCC_INLINE void storePart(u8* p, int count, wide::U8 samples)
+    static PYXCC_INLINE Samples loadPart(const u8* p, int count)
     {
-        alignas(32) u8 buffer[block];
+        alignas(32) u8 buffer[32] = {};
+        copyBytes(buffer, p, count * sampleBytes<Samples>);
+        return loadSamples<Samples>(buffer);
+    }
+
+    static PYXCC_INLINE void storePart(u8* p, int count, Samples samples)
+    {
+        alignas(32) u8 buffer[32];
         storeSamples(buffer, samples);
-        copyBytes(p, buffer, count);
+        copyBytes(p, buffer, count * sampleBytes<Samples>);
     }
 };
 

@@ -20,6 +20,16 @@ struct U8 {
     PYXCC_INLINE U8(int k) : v(_mm256_set1_epi8(static_cast<char>(k))) {}
 };
 
+/// 32 signed samples of 8 bits, as they lie in memory.
+struct S8 {
+    static constexpr int count = 32;
+    __m256i v;
+
+    S8() = default;
+    PYXCC_INLINE explicit S8(__m256i value) : v(value) {}
+    PYXCC_INLINE S8(int k) : v(_mm256_set1_epi8(static_cast<char>(k))) {}
+};
+
 struct S16 {
     static constexpr int count = 16;
     __m256i v;

@@ -1,12 +1,15 @@
-// Between 32 interleaved pixels of bytes in memory and a register a channel.
+// Between interleaved pixels in memory and a register a channel, for samples of 1, 2 and 4 bytes: a block is as many
+// pixels as a register has samples. Registers here are what they are in memory, 32 bytes.
 #pragma once
 
-#include "lanes/avx2/integers.hpp"
+#include "lanes/avx2/samples.hpp"
 
 #include <array>
 
 namespace pyxcc::layouts
 {
+
+template <class Samples> inline constexpr int sampleBytes = 32 / Samples::count;
 
 namespace detail
 {
@@ -14,7 +17,21 @@ namespace detail
 PYXCC_INLINE __m256i loadWhole(const u8* p) { return _mm256_loadu_si256(reinterpret_cast<const __m256i*>(p)); }
 PYXCC_INLINE void storeWhole(u8* p, __m256i v) { _mm256_storeu_si256(reinterpret_cast<__m256i*>(p), v); }
 
+template <class Samples> PYXCC_INLINE Samples as(__m256i v) { return Samples(v); }
+template <> PYXCC_INLINE wide::F32 as<wide::F32>(__m256i v) { return wide::F32(_mm256_castsi256_ps(v)); }
+
+template <class Samples> PYXCC_INLINE __m256i raw(Samples x) { return x.v; }
+PYXCC_INLINE __m256i raw(wide::F32 x) { return _mm256_castps_si256(x.v); }
+
 using Places = std::array<u8, 16>;
+
+/// The places of samples in a 128-bit lane as those of their bytes.
+template <int Bytes, class PlaceOf> constexpr Places placesOfBytes(PlaceOf placeOf)
+{
+    Places places{};
+    for (int i = 0; i < 16; ++i) places[i] = static_cast<u8>(placeOf(i / Bytes) * Bytes + i % Bytes);
+    return places;
+}
 
 /// The same places in both 128-bit lanes, as a shuffle takes them.
 PYXCC_INLINE __m256i inBothLanes(const Places& places)
@@ -22,76 +39,118 @@ PYXCC_INLINE __m256i inBothLanes(const Places& places)
     return _mm256_broadcastsi128_si256(_mm_loadu_si128(reinterpret_cast<const __m128i*>(places.data())));
 }
 
-/// Entry i is factor * (i - start) modulo 16.
-constexpr Places stride(int factor, int start)
-{
-    Places places{};
-    for (int i = 0; i < 16; ++i) places[i] = static_cast<u8>((factor * (i - start)) & 15);
-    return places;
-}
-
-// 16 pixels of three channels are 48 bytes, or three registers. Channel c has its sample i at byte 3 i + c. Modulo 16
-// these places do not clash, so that one register can hold the whole channel, each sample at its place: `mixed` is that
-// register, made by taking every third byte of each of the three. 3 and 11 are inverse to each other modulo 16.
-constexpr Places gather0 = stride(3, 0), gather1 = stride(3, 5), gather2 = stride(3, 10);   // place 3 i + c to i
-constexpr Places spread0 = stride(11, 0), spread1 = stride(11, 1), spread2 = stride(11, 2); // i to place 3 i + c
-
-constexpr Places everyThird(int start)
-{
-    Places places{};
-    for (int i = start; i < 16; i += 3) places[i] = 0xff;
-    return places;
-}
-constexpr Places secondThird = everyThird(1), lastThird = everyThird(2);
-
-/// In each lane, the bytes whose place modulo 3 is 0 from x, 1 from y and 2 from z.
-PYXCC_INLINE __m256i byThirds(__m256i x, __m256i y, __m256i z)
-{
-    return _mm256_blendv_epi8(_mm256_blendv_epi8(x, y, inBothLanes(secondThird)), z, inBothLanes(lastThird));
-}
-
 PYXCC_INLINE __m256i shuffle(__m256i x, const Places& places) { return _mm256_shuffle_epi8(x, inBothLanes(places)); }
+
+// As many pixels of three channels as a 128-bit lane has samples fill three lanes. Channel c has its sample i at place
+// 3 i + c of them. Modulo the number of samples in a lane, which is a power of two, these places do not clash, so that
+// one lane can hold the whole channel, each sample at its place: it is made by taking every third sample of each of the
+// three, and a shuffle brings the samples into order.
+template <int Bytes> struct Thirds {
+    static constexpr int samples = 16 / Bytes;
+    static constexpr int inverseOf3 = samples == 16 ? 11 : 3; // modulo `samples`
+
+    /// Place 3 i + c to place i.
+    template <int C> static constexpr Places gather = placesOfBytes<Bytes>([](int i) { return (3 * i + C) % samples; });
+    /// Place i to place 3 i + c.
+    template <int C>
+    static constexpr Places spread = placesOfBytes<Bytes>([](int i) {
+        return inverseOf3 * (i - C + samples) % samples;
+    });
+
+    /// The bytes of the samples at `start` and every third place behind it.
+    static constexpr Places mask(int start)
+    {
+        Places places{};
+        for (int i = 0; i < 16; ++i) places[i] = i / Bytes % 3 == start ? 0xff : 0;
+        return places;
+    }
+    static constexpr Places second = mask(1), last = mask(2);
+
+    /// In each lane, the samples whose place modulo 3 is 0 from x, 1 from y and 2 from z.
+    static PYXCC_INLINE __m256i blend(__m256i x, __m256i y, __m256i z)
+    {
+        if constexpr (Bytes == 4) {
+            return _mm256_blend_epi32(_mm256_blend_epi32(x, y, 0x22), z, 0x44);
+        } else if constexpr (Bytes == 2) {
+            return _mm256_blend_epi16(_mm256_blend_epi16(x, y, 0x92), z, 0x24);
+        } else {
+            return _mm256_blendv_epi8(_mm256_blendv_epi8(x, y, inBothLanes(second)), z, inBothLanes(last));
+        }
+    }
+};
+
+/// Low or high halves of the 128-bit lanes, interleaved by elements of `Bytes`.
+template <int Bytes> PYXCC_INLINE __m256i unpackLow(__m256i x, __m256i y)
+{
+    if constexpr (Bytes == 1) return _mm256_unpacklo_epi8(x, y);
+    if constexpr (Bytes == 2) return _mm256_unpacklo_epi16(x, y);
+    if constexpr (Bytes == 4) return _mm256_unpacklo_epi32(x, y);
+    if constexpr (Bytes == 8) return _mm256_unpacklo_epi64(x, y);
+}
+template <int Bytes> PYXCC_INLINE __m256i unpackHigh(__m256i x, __m256i y)
+{
+    if constexpr (Bytes == 1) return _mm256_unpackhi_epi8(x, y);
+    if constexpr (Bytes == 2) return _mm256_unpackhi_epi16(x, y);
+    if constexpr (Bytes == 4) return _mm256_unpackhi_epi32(x, y);
+    if constexpr (Bytes == 8) return _mm256_unpackhi_epi64(x, y);
+}
 
 } // namespace detail
 
-/// Reads 32 pixels, 96 bytes.
-PYXCC_INLINE Three<wide::U8> loadTriples(const u8* p)
+/// Reads a block of pixels of three samples, 96 bytes.
+template <class Samples> PYXCC_INLINE Three<Samples> loadTriples(const u8* p)
 {
+    using Thirds = detail::Thirds<sampleBytes<Samples>>;
     const __m256i first = detail::loadWhole(p), second = detail::loadWhole(p + 32), third = detail::loadWhole(p + 64);
-    // x, y, z: 16 pixels in the low lanes, 16 in the high ones.
+    // x, y, z: half of the block in the low lanes, the other half in the high ones.
     const __m256i x = _mm256_blend_epi32(first, second, 0xf0);
-    const __m256i y = _mm256_permute2x128_si256(first, third, 0x21);
-    const __m256i z = _mm256_blend_epi32(second, third, 0xf0);
-    return {wide::U8(detail::shuffle(detail::byThirds(x, z, y), detail::gather0)),
-            wide::U8(detail::shuffle(detail::byThirds(y, x, z), detail::gather1)),
-            wide::U8(detail::shuffle(detail::byThirds(z, y, x), detail::gather2))};
+    const __m256i middle = _mm256_permute2x128_si256(first, third, 0x21);
+    const __m256i end = _mm256_blend_epi32(second, third, 0xf0);
+    // A lane ends within a pixel, after its first sample or its second: two lanes change their parts.
+    constexpr bool afterFirst = Thirds::samples % 3 == 1;
+    const __m256i y = afterFirst ? middle : end, z = afterFirst ? end : middle;
+    return {detail::as<Samples>(detail::shuffle(Thirds::blend(x, z, y), Thirds::template gather<0>)),
+            detail::as<Samples>(detail::shuffle(Thirds::blend(y, x, z), Thirds::template gather<1>)),
+            detail::as<Samples>(detail::shuffle(Thirds::blend(z, y, x), Thirds::template gather<2>))};
 }
 
-/// Writes 32 pixels, 96 bytes.
-PYXCC_INLINE void storeTriples(u8* p, const Three<wide::U8>& pixels)
+/// Writes a block of pixels of three samples, 96 bytes.
+template <class Samples> PYXCC_INLINE void storeTriples(u8* p, const Three<Samples>& pixels)
 {
-    const __m256i a = detail::shuffle(pixels.a.v, detail::spread0);
-    const __m256i b = detail::shuffle(pixels.b.v, detail::spread1);
-    const __m256i c = detail::shuffle(pixels.c.v, detail::spread2);
-    const __m256i x = detail::byThirds(a, b, c), y = detail::byThirds(b, c, a), z = detail::byThirds(c, a, b);
+    using Thirds = detail::Thirds<sampleBytes<Samples>>;
+    const __m256i a = detail::shuffle(detail::raw(pixels.a), Thirds::template spread<0>);
+    const __m256i b = detail::shuffle(detail::raw(pixels.b), Thirds::template spread<1>);
+    const __m256i c = detail::shuffle(detail::raw(pixels.c), Thirds::template spread<2>);
+    constexpr bool afterFirst = Thirds::samples % 3 == 1;
+    const __m256i x = Thirds::blend(a, b, c);
+    const __m256i y = afterFirst ? Thirds::blend(b, c, a) : Thirds::blend(c, a, b);
+    const __m256i z = afterFirst ? Thirds::blend(c, a, b) : Thirds::blend(b, c, a);
     detail::storeWhole(p, _mm256_permute2x128_si256(x, y, 0x20));
     detail::storeWhole(p + 32, _mm256_blend_epi32(z, x, 0xf0));
     detail::storeWhole(p + 64, _mm256_permute2x128_si256(y, z, 0x31));
 }
 
-/// Reads 32 pixels, 128 bytes.
-PYXCC_INLINE Four<wide::U8> loadQuadruples(const u8* p)
+/// Reads a block of pixels of four samples, 128 bytes.
+template <class Samples> PYXCC_INLINE Four<Samples> loadQuadruples(const u8* p)
 {
     // Four bytes of a channel side by side, then eight, then sixteen; the lanes come out interleaved by fours.
-    constexpr detail::Places byChannel = {0, 4, 8, 12, 1, 5, 9, 13, 2, 6, 10, 14, 3, 7, 11, 15};
-    const __m256i x0 = detail::shuffle(detail::loadWhole(p), byChannel);
-    const __m256i x1 = detail::shuffle(detail::loadWhole(p + 32), byChannel);
-    const __m256i x2 = detail::shuffle(detail::loadWhole(p + 64), byChannel);
-    const __m256i x3 = detail::shuffle(detail::loadWhole(p + 96), byChannel);
+    const auto fours = [p](int at) PYXCC_INLINE_LAMBDA {
+        constexpr int bytes = sampleBytes<Samples>;
+        const __m256i x = detail::loadWhole(p + at);
+        if constexpr (bytes == 4) {
+            return x;
+        } else {
+            constexpr int pixels = 4 / bytes;
+            return detail::shuffle(x, detail::placesOfBytes<bytes>([](int i) { return i % pixels * 4 + i / pixels; }));
+        }
+    };
+    const __m256i x0 = fours(0), x1 = fours(32), x2 = fours(64), x3 = fours(96);
     const __m256i ab0 = _mm256_unpacklo_epi32(x0, x1), ab1 = _mm256_unpacklo_epi32(x2, x3);
     const __m256i cd0 = _mm256_unpackhi_epi32(x0, x1), cd1 = _mm256_unpackhi_epi32(x2, x3);
     const __m256i inOrder = _mm256_setr_epi32(0, 4, 1, 5, 2, 6, 3, 7);
-    const auto channel = [&](__m256i lanes) { return wide::U8(_mm256_permutevar8x32_epi32(lanes, inOrder)); };
+    const auto channel = [&](__m256i lanes) PYXCC_INLINE_LAMBDA {
+        return detail::as<Samples>(_mm256_permutevar8x32_epi32(lanes, inOrder));
+    };
     return {channel(_mm256_unpacklo_epi64(ab0, ab1)), channel(_mm256_unpackhi_epi64(ab0, ab1)),
             channel(_mm256_unpacklo_epi64(cd0, cd1)), channel(_mm256_unpackhi_epi64(cd0, cd1))};
 }
@@ -99,23 +158,23 @@ PYXCC_INLINE Four<wide::U8> loadQuadruples(const u8* p)
 namespace detail
 {
 
-/// The four registers of 8 interleaved pixels each.
-PYXCC_INLINE Four<wide::U8> interleave(const Four<wide::U8>& pixels)
+/// The four registers of interleaved pixels, in the order of memory.
+template <class Samples> PYXCC_INLINE Four<wide::U8> interleave(const Four<Samples>& pixels)
 {
-    const __m256i ab0 = _mm256_unpacklo_epi8(pixels.a.v, pixels.b.v),
-                  ab1 = _mm256_unpackhi_epi8(pixels.a.v, pixels.b.v);
-    const __m256i cd0 = _mm256_unpacklo_epi8(pixels.c.v, pixels.d.v),
-                  cd1 = _mm256_unpackhi_epi8(pixels.c.v, pixels.d.v);
-    const __m256i x0 = _mm256_unpacklo_epi16(ab0, cd0), x1 = _mm256_unpackhi_epi16(ab0, cd0);
-    const __m256i x2 = _mm256_unpacklo_epi16(ab1, cd1), x3 = _mm256_unpackhi_epi16(ab1, cd1);
+    constexpr int bytes = sampleBytes<Samples>;
+    const __m256i a = raw(pixels.a), b = raw(pixels.b), c = raw(pixels.c), d = raw(pixels.d);
+    const __m256i ab0 = unpackLow<bytes>(a, b), ab1 = unpackHigh<bytes>(a, b);
+    const __m256i cd0 = unpackLow<bytes>(c, d), cd1 = unpackHigh<bytes>(c, d);
+    const __m256i x0 = unpackLow<2 * bytes>(ab0, cd0), x1 = unpackHigh<2 * bytes>(ab0, cd0);
+    const __m256i x2 = unpackLow<2 * bytes>(ab1, cd1), x3 = unpackHigh<2 * bytes>(ab1, cd1);
     return {wide::U8(_mm256_permute2x128_si256(x0, x1, 0x20)), wide::U8(_mm256_permute2x128_si256(x2, x3, 0x20)),
             wide::U8(_mm256_permute2x128_si256(x0, x1, 0x31)), wide::U8(_mm256_permute2x128_si256(x2, x3, 0x31))};
 }
 
 } // namespace detail
 
-/// Writes 32 pixels, 128 bytes.
-PYXCC_INLINE void storeQuadruples(u8* p, const Four<wide::U8>& pixels)
+/// Writes a block of pixels of four samples, 128 bytes.
+template <class Samples> PYXCC_INLINE void storeQuadruples(u8* p, const Four<Samples>& pixels)
 {
     const Four<wide::U8> x = detail::interleave(pixels);
     detail::storeWhole(p, x.a.v);
@@ -124,13 +183,22 @@ PYXCC_INLINE void storeQuadruples(u8* p, const Four<wide::U8>& pixels)
     detail::storeWhole(p + 96, x.d.v);
 }
 
-/// Writes the first three bytes of 32 pixels; each fourth byte is put back as it was.
-PYXCC_INLINE void storeTriplesOfQuadruples(u8* p, const Three<wide::U8>& pixels)
+/// Writes the first three samples of a block of pixels of four; each fourth sample is put back as it was.
+template <class Samples> PYXCC_INLINE void storeTriplesOfQuadruples(u8* p, const Three<Samples>& pixels)
 {
-    const Four<wide::U8> x = detail::interleave({pixels.a, pixels.b, pixels.c, wide::U8(0)});
-    const __m256i fourth = _mm256_set1_epi32(static_cast<int>(0xff000000u));
-    const auto store = [fourth](u8* at, wide::U8 pixels8) {
-        detail::storeWhole(at, _mm256_blendv_epi8(pixels8.v, detail::loadWhole(at), fourth));
+    constexpr int bytes = sampleBytes<Samples>;
+    const Four<wide::U8> x =
+        detail::interleave(Four<Samples>{pixels.a, pixels.b, pixels.c, detail::as<Samples>(_mm256_setzero_si256())});
+    const auto store = [](u8* at, wide::U8 pixels32) PYXCC_INLINE_LAMBDA {
+        const __m256i old = detail::loadWhole(at);
+        if constexpr (bytes == 4) {
+            detail::storeWhole(at, _mm256_blend_epi32(pixels32.v, old, 0x88));
+        } else if constexpr (bytes == 2) {
+            detail::storeWhole(at, _mm256_blend_epi16(pixels32.v, old, 0x88));
+        } else {
+            const __m256i fourth = _mm256_set1_epi32(static_cast<int>(0xff000000u));
+            detail::storeWhole(at, _mm256_blendv_epi8(pixels32.v, old, fourth));
+        }
     };
     store(p, x.a);
     store(p + 32, x.b);
@@ -138,7 +206,13 @@ PYXCC_INLINE void storeTriplesOfQuadruples(u8* p, const Three<wide::U8>& pixels)
     store(p + 96, x.d);
 }
 
-PYXCC_INLINE wide::U8 loadSamples(const u8* p) { return wide::U8(detail::loadWhole(p)); }
-PYXCC_INLINE void storeSamples(u8* p, wide::U8 samples) { detail::storeWhole(p, samples.v); }
+template <class Samples = wide::U8> PYXCC_INLINE Samples loadSamples(const u8* p)
+{
+    return detail::as<Samples>(detail::loadWhole(p));
+}
+template <class Samples> PYXCC_INLINE void storeSamples(u8* p, Samples samples)
+{
+    detail::storeWhole(p, detail::raw(samples));
+}
 
 } // namespace pyxcc::layouts
