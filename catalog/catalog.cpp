@@ -15,10 +15,13 @@ namespace
 
 using detail::Cursor;
 
+/// Empty for what is not a number, such as the planes in front of the region.
 template <class T> constexpr std::string_view cName()
 {
     if constexpr (std::is_floating_point_v<T>) {
         return sizeof(T) == 4 ? "f32" : "f64";
+    } else if constexpr (!std::is_integral_v<T>) {
+        return {};
     } else {
         constexpr std::string_view names[2][3] = {{"u8", "u16", "u32"}, {"s8", "s16", "s32"}};
         return names[std::is_signed_v<T>][std::bit_width(sizeof(T)) - 1];
