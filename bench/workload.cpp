@@ -68,6 +68,29 @@ void addSide(Workload& work, const catalog::Side& side, catalog::Range range, vo
     }
 }
 
+/// The standard values of a list of numbers, in memory as the parameter's pointer has them.
+template <class T> Buffer listOf(const catalog::Parameter& parameter)
+{
+    Buffer list = allocate(parameter.count * sizeof(T));
+    for (int i = 0; i < parameter.count; ++i) {
+        const T number = static_cast<T>(parameter.standard[i]);
+        std::memcpy(list.get() + i * sizeof(T), &number, sizeof(T));
+    }
+    return list;
+}
+
+void addParameters(Workload& work, const catalog::Export& entry)
+{
+    for (int i = 0; i < entry.parameterCount; ++i) {
+        const catalog::Parameter& parameter = entry.traits.parameters[i];
+        const catalog::ParameterType& type = entry.parameterTypes[i];
+        work.call.parameters[i].number = parameter.standard[0];
+        if (!type.pointer) continue;
+        work.lists.push_back(type.type == "f64" ? listOf<f64>(parameter) : listOf<f32>(parameter));
+        work.call.parameters[i].pointer = work.lists.back().get();
+    }
+}
+
 } // namespace
 
 Buffer allocate(std::size_t bytes)
@@ -90,9 +113,7 @@ Workload prepare(const catalog::Export& entry, RoiSize roi)
     } else {
         addSide(work, entry.target, {}, work.call.target.data(), work.call.targetStep.data());
     }
-    for (std::size_t i = 0; i < work.call.parameters.size(); ++i) {
-        work.call.parameters[i].number = entry.traits.parameters[i].standard[0];
-    }
+    addParameters(work, entry);
     return work;
 }
 

@@ -24,6 +24,7 @@ Buffer allocate(std::size_t bytes);
 /// A call with tight images of its own. Parameters have their standard values.
 struct Workload {
     std::vector<Buffer> planes;
+    std::vector<Buffer> lists; ///< parameters that are pointers
     catalog::Invocation call;
     std::size_t bytes =
         0; ///< of source and target: all that the layouts hold, a fourth channel that is not read included
