@@ -1,0 +1,224 @@
+#include "describe.hpp"
+
+#include "component.hpp"
+#include "status.hpp"
+
+#include <algorithm>
+#include <sstream>
+
+namespace tool
+{
+
+namespace
+{
+
+using catalog::Arrangement;
+using catalog::Minimum;
+using catalog::Order;
+using catalog::Side;
+using catalog::Steps;
+
+/// "u8" of samples; a plane of bits is one of bytes.
+std::string typeOf(const Side& side)
+{
+    return std::string(side.element == catalog::Element::bit ? "u8" : catalog::nameOf(side.element));
+}
+
+std::string extent(int count)
+{
+    std::string text = "[";
+    text += std::to_string(count);
+    text += "]";
+    return text;
+}
+
+/// One end's pointers and steps. `qualifier` is "const " for what is only read.
+std::string imageArguments(const Side& side, const std::string& name, const std::string& qualifier)
+{
+    const std::string type = qualifier + typeOf(side);
+    if (side.arrangement == Arrangement::semiPlanar) {
+        return type + "* " + name + "Y, int " + name + "YStep, " + type + "* " + name + "CbCr, int " + name +
+               "CbCrStep";
+    }
+    const std::string count = extent(side.planes);
+    const bool planar = side.arrangement == Arrangement::planar;
+    const std::string image = planar ? type + "* const " + name + count : type + "* " + name;
+    switch (side.steps) {
+    case Steps::one:
+        return image + ", int " + name + "Step";
+    case Steps::each:
+        return image + ", const int " + name + "Step" + count;
+    default:
+        return image;
+    }
+}
+
+std::string parameterArgument(const catalog::Parameter& parameter, const catalog::ParameterType& type)
+{
+    std::string text = std::string(type.type) + " " + std::string(parameter.name);
+    if (!type.pointer) return text;
+    text.insert(0, "const ");
+    return text + (type.columns == 0 ? extent(parameter.count)
+                                     : extent(parameter.count / type.columns) + extent(type.columns));
+}
+
+/// The samples that stand next to each other, in the words of the model: "R G B A", "Y Cb Y Cr".
+std::string sampleOrder(const Side& side)
+{
+    std::vector<std::string_view> names = componentsOf(side);
+    if (side.layout == "C2") {
+        names = names[0] == "Y" ? std::vector{names[0], names[1], names[0], names[2]}
+                                : std::vector{names[0], names[1], names[2], names[1]};
+    }
+    if (side.spareFourth) names[3] = "-";
+    std::string text;
+    for (std::string_view name : names) text += (text.empty() ? "" : " ") + std::string(name);
+    return text;
+}
+
+std::string divided(const std::string& length, int shift)
+{
+    return shift == 0 ? length : length + "/" + std::to_string(1 << shift);
+}
+
+std::string stepWords(const Side& side)
+{
+    switch (side.steps) {
+    case Steps::none:
+        return "rows end to end";
+    case Steps::one:
+        return side.planes == 1 ? "a step" : "one step for all planes";
+    default:
+        return "a step for each plane";
+    }
+}
+
+std::string shapeWords(const Side& side)
+{
+    const std::string full = "width x height";
+    const std::string chroma = divided("width", side.chromaX) + " x " + divided("height", side.chromaY);
+    std::ostringstream text;
+    if (isPacked(side)) {
+        text << "one 16-bit pixel of the fields " << sampleOrder(side) << " from the low bits up";
+    } else if (side.arrangement == Arrangement::interleaved) {
+        text << sampleOrder(side);
+        if (side.element == catalog::Element::bit) {
+            text << ", 8 pixels a byte";
+        } else if (side.samples > 1 || catalog::sizeOf(side.element) > 1) {
+            text << ", " << side.samples * catalog::sizeOf(side.element) << " bytes a pixel";
+        }
+    } else if (side.arrangement == Arrangement::semiPlanar) {
+        const auto names = componentsOf(side);
+        text << "planes " << names[0] << " (" << full << ") and " << names[1] << ' ' << names[2] << " pairs (" << chroma
+             << ")";
+    } else {
+        text << "planes";
+        const auto names = componentsOf(side);
+        for (std::size_t plane = 0; plane < names.size(); ++plane) {
+            const bool shared = (plane == 1 || plane == 2) && side.chromaX + side.chromaY > 0;
+            text << (plane == 0 ? " " : ", ") << names[plane];
+            if (side.chromaX + side.chromaY > 0) text << " (" << (shared ? chroma : full) << ")";
+        }
+    }
+    const Range range = rangeOf(side.element);
+    if (!isPacked(side)) text << "; " << range.low << " to " << range.high;
+    text << "; " << stepWords(side);
+    return text.str();
+}
+
+std::string orderWords(const catalog::Export& entry)
+{
+    const bool planar = entry.source.planes + entry.target.planes > 2;
+    std::string text;
+    switch (entry.traits.order) {
+    case Order::pointersElementsSize:
+        text = planar ? "null pointers, null planes, size" : "null pointers, size";
+        break;
+    case Order::pointersSizeElements:
+        text = "null pointers, size, null planes";
+        break;
+    }
+    if (entry.traits.untested == catalog::Untested::targetArray) text += "; the target's array of planes is not tested";
+    return text;
+}
+
+/// "at least 4, a multiple of 4"
+std::string bound(int least, int multiple)
+{
+    if (least == Minimum::any) return "not tested";
+    return "at least " + std::to_string(least) + (multiple > 1 ? ", a multiple of " + std::to_string(multiple) : "");
+}
+
+std::string statusWords(const catalog::Export& entry)
+{
+    const Minimum& minimum = entry.traits.minimum;
+    std::string text = statusText(pyxOk) + ", " + statusText(pyxErrNullPtr);
+    if (minimum.width != Minimum::any || minimum.height != Minimum::any) text += ", " + statusText(pyxErrSize);
+    switch (entry.traits.warning) {
+    case catalog::Warning::never:
+        break;
+    case catalog::Warning::oddWidth:
+        text += ", " + statusText(pyxWarnOddSize) + " for an odd width";
+        break;
+    case catalog::Warning::oddSize:
+        text += ", " + statusText(pyxWarnOddSize) + " for an odd width or height";
+        break;
+    }
+    return text;
+}
+
+std::string parameterWords(const catalog::Parameter& parameter)
+{
+    std::ostringstream text;
+    text << parameter.name << ": ";
+    if (parameter.count > 0) text << parameter.count << " numbers of ";
+    text << parameter.low << " to " << parameter.high << "; if not set";
+    for (int i = 0; i < std::max(parameter.count, 1); ++i) text << (i == 0 ? " " : ",") << parameter.standard[i];
+    return text.str();
+}
+
+} // namespace
+
+std::string conversionOf(const catalog::Export& entry)
+{
+    if (entry.inPlace) return nameOf(entry.source) + " in place";
+    return nameOf(entry.source) + " -> " + nameOf(entry.target);
+}
+
+std::string prototypeOf(const catalog::Export& entry)
+{
+    std::string text = "PyxStatus " + std::string(entry.name) + "(";
+    text += entry.inPlace
+                ? imageArguments(entry.source, "srcDst", "")
+                : imageArguments(entry.source, "src", "const ") + ", " + imageArguments(entry.target, "dst", "");
+    text += ", RoiSize roi";
+    for (int index = 0; index < entry.parameterCount; ++index) {
+        text += ", " + parameterArgument(entry.traits.parameters[index], entry.parameterTypes[index]);
+    }
+    return text + ");";
+}
+
+std::string sheetOf(const catalog::Export& entry)
+{
+    const catalog::FamilyInfo& family = catalog::infoOf(entry.family);
+    const Minimum& minimum = entry.traits.minimum;
+    std::ostringstream text;
+    text << entry.name << "\n"
+         << family.title << " (" << family.slug << "). " << family.text << "\n\n"
+         << prototypeOf(entry) << "\n\n";
+    const auto line = [&text](std::string_view label, const std::string& words) {
+        text << "  " << label << std::string(12 - label.size(), ' ') << words << "\n";
+    };
+    line(entry.inPlace ? "image" : "source", nameOf(entry.source) + ": " + shapeWords(entry.source));
+    if (!entry.inPlace) line("target", nameOf(entry.target) + ": " + shapeWords(entry.target));
+    for (int index = 0; index < entry.parameterCount; ++index) {
+        line(index == 0 ? "parameters" : "", parameterWords(entry.traits.parameters[index]));
+    }
+    line("tests", orderWords(entry));
+    line("width", bound(minimum.width, minimum.widthMultiple));
+    line("height", bound(minimum.height, minimum.heightMultiple));
+    line("statuses", statusWords(entry));
+    return text.str();
+}
+
+} // namespace tool

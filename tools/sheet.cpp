@@ -1,0 +1,193 @@
+#include "sheet.hpp"
+
+#include "describe.hpp"
+#include "status.hpp"
+
+#include <cstdio>
+#include <sstream>
+
+namespace tool
+{
+
+namespace
+{
+
+constexpr std::string_view style = R"(
+:root {
+  color-scheme: light dark;
+  --page: #f6f6f4; --card: #ffffff; --ink: #1b1c1e; --soft: #5b6067; --line: #dcdcd8; --link: #0b57a4;
+  --good: #12693a; --warn: #8a5a00; --bad: #a81e1e;
+}
+@media (prefers-color-scheme: dark) {
+  :root {
+    --page: #16181b; --card: #1f2226; --ink: #e9eaec; --soft: #a3a9b1; --line: #34383e; --link: #8ab8f0;
+    --good: #6fd39a; --warn: #e8b95a; --bad: #f28b82;
+  }
+}
+* { box-sizing: border-box; }
+html { scroll-behavior: smooth; -webkit-text-size-adjust: 100%; }
+body { margin: 0; background: var(--page); color: var(--ink); font: 16px/1.5 system-ui, sans-serif; }
+body > * { max-width: 1600px; margin-inline: auto; padding-inline: clamp(12px, 2.5vw, 32px); }
+a { color: var(--link); }
+h1 { margin: 0 0 4px; font-size: clamp(1.4rem, 4vw, 2rem); line-height: 1.2; }
+h2 { margin: 0; font-size: 1.3rem; line-height: 1.3; }
+h3 { margin: 0; font: 600 0.86rem/1.35 ui-monospace, monospace; overflow-wrap: anywhere; }
+p { margin: 0; }
+header { display: flex; flex-wrap: wrap; gap: 16px 28px; align-items: center; padding-block: 24px 16px; }
+header img { width: min(100%, 300px); height: auto; border-radius: 8px; }
+header p, .about { color: var(--soft); }
+nav { padding-block: 8px 16px; border-bottom: 1px solid var(--line); }
+nav ul { list-style: none; margin: 0; padding: 0; columns: 270px; column-gap: 28px; }
+nav li { display: flex; justify-content: space-between; gap: 10px; padding: 4px 0; break-inside: avoid; }
+nav li span { color: var(--soft); font-variant-numeric: tabular-nums; }
+section { padding-block: 26px 6px; scroll-margin-top: 8px; }
+.about { margin: 2px 0 14px; max-width: 75ch; }
+.cards { display: grid; gap: 16px; grid-template-columns: repeat(auto-fill, minmax(min(100%, 290px), 1fr)); }
+article {
+  display: flex; flex-direction: column; background: var(--card); border: 1px solid var(--line); border-radius: 10px;
+  overflow: hidden; content-visibility: auto; contain-intrinsic-size: auto 430px;
+}
+article img { display: block; width: 100%; height: auto; }
+.parts { padding: 8px 12px 0; }
+.names { display: flex; color: var(--soft); font-size: 0.78rem; }
+.names span { flex: 1; text-align: center; }
+.text { display: flex; flex-direction: column; gap: 3px; padding: 10px 12px 12px; }
+.text p { font-size: 0.88rem; }
+.facts { display: flex; flex-wrap: wrap; gap: 0 14px; font-variant-numeric: tabular-nums; }
+.way { color: var(--soft); overflow-wrap: anywhere; }
+.text .way { font-size: 0.78rem; }
+.good { color: var(--good); } .warn { color: var(--warn); } .bad { color: var(--bad); }
+.none { display: grid; place-items: center; min-height: 90px; padding: 12px; color: var(--soft); font-size: 0.88rem; }
+footer { padding-block: 24px 40px; color: var(--soft); font-size: 0.88rem; }
+)";
+
+std::string escaped(std::string_view text)
+{
+    std::string result;
+    for (const char c : text) {
+        switch (c) {
+        case '&':
+            result += "&amp;";
+            break;
+        case '<':
+            result += "&lt;";
+            break;
+        case '>':
+            result += "&gt;";
+            break;
+        case '"':
+            result += "&quot;";
+            break;
+        default:
+            result += c;
+        }
+    }
+    return result;
+}
+
+std::string image(const Shown& shown, const std::string& description)
+{
+    std::ostringstream text;
+    text << "<img src=\"" << escaped(shown.file) << "\" width=\"" << shown.size.width << "\" height=\""
+         << shown.size.height << "\" loading=\"lazy\" decoding=\"async\" alt=\"" << escaped(description) << "\">";
+    return text.str();
+}
+
+std::string arrowed(const std::string& conversion)
+{
+    const auto arrow = conversion.find("->");
+    return arrow == std::string::npos ? conversion : conversion.substr(0, arrow) + "→" + conversion.substr(arrow + 2);
+}
+
+std::string_view toneOf(PyxStatus status) { return status < 0 ? "bad" : status > 0 ? "warn" : "good"; }
+
+void writeCard(std::ostream& out, const Card& card)
+{
+    const std::string name(card.entry->name);
+    out << "<article id=\"" << name << "\">\n";
+    if (!card.picture.file.empty()) {
+        out << image(card.picture, "The picture after " + name) << "\n";
+    } else if (card.tiles.file.empty()) {
+        out << "<div class=\"none\">" << (card.called ? "Nothing was written." : "No way to its source yet.")
+            << "</div>\n";
+    }
+    if (!card.tiles.file.empty()) {
+        out << "<div class=\"parts\">" << image(card.tiles, "The components of the target") << "<div class=\"names\">";
+        for (std::string_view component : card.components) out << "<span>" << escaped(component) << "</span>";
+        out << "</div></div>\n";
+    }
+    out << "<div class=\"text\">\n<h3>" << name << "</h3>\n<p>" << escaped(arrowed(conversionOf(*card.entry)))
+        << "</p>\n";
+    if (card.called) {
+        out << "<p class=\"facts\"><span class=\"" << toneOf(card.status) << "\">" << statusText(card.status)
+            << "</span>";
+        if (card.status >= 0) {
+            out << "<span>" << timeText(card.seconds) << "</span><span>" << rateText(card.bytes, card.seconds)
+                << "</span>";
+        }
+        out << "<span>" << card.size.width << " × " << card.size.height << "</span></p>\n";
+    }
+    if (!card.way.empty()) out << "<p class=\"way\">" << escaped(card.way) << "</p>\n";
+    out << "</div>\n</article>\n";
+}
+
+void writeIndex(std::ostream& out, const Sheet& sheet)
+{
+    out << "<nav aria-label=\"Families\">\n<ul>\n";
+    for (const Section& section : sheet.sections) {
+        out << "<li><a href=\"#" << section.family->slug << "\">" << escaped(section.family->title) << "</a> <span>"
+            << section.cards.size() << "</span></li>\n";
+    }
+    out << "</ul>\n</nav>\n";
+}
+
+void writeSection(std::ostream& out, const Section& section)
+{
+    out << "<section id=\"" << section.family->slug << "\">\n<h2>" << escaped(section.family->title)
+        << "</h2>\n<p class=\"about\">" << escaped(section.family->text) << "</p>\n<div class=\"cards\">\n";
+    for (const Card& card : section.cards) writeCard(out, card);
+    out << "</div>\n</section>\n";
+}
+
+std::string formatted(const char* format, double value)
+{
+    char text[64];
+    std::snprintf(text, sizeof text, format, value);
+    return text;
+}
+
+} // namespace
+
+std::string timeText(double seconds)
+{
+    if (seconds < 1e-3) return formatted("%.1f µs", seconds * 1e6);
+    return seconds < 1 ? formatted("%.2f ms", seconds * 1e3) : formatted("%.2f s", seconds);
+}
+
+std::string rateText(double bytes, double seconds)
+{
+    return formatted("%.2f GB/s", seconds > 0 ? bytes / seconds / 1e9 : 0);
+}
+
+std::string html(const Sheet& sheet)
+{
+    std::size_t count = 0;
+    for (const Section& section : sheet.sections) count += section.cards.size();
+    std::ostringstream out;
+    out << "<!doctype html>\n<html lang=\"en\">\n<head>\n<meta charset=\"utf-8\">\n"
+        << "<meta name=\"viewport\" content=\"width=device-width, initial-scale=1\">\n<title>pyxcc: "
+        << escaped(sheet.title) << "</title>\n<style>" << style << "</style>\n</head>\n<body>\n<header>\n"
+        << image(sheet.picture, "The source picture") << "\n<div>\n<h1>pyxcc tour</h1>\n<p>" << count
+        << (count == 1 ? " conversion of " : " conversions of ") << escaped(sheet.title) << ", " << sheet.size.width
+        << " × " << sheet.size.height << "</p>\n<p>Library " << escaped(pyxccGetLibVersion()->versionText)
+        << "</p>\n</div>\n</header>\n";
+    writeIndex(out, sheet);
+    out << "<main>\n";
+    for (const Section& section : sheet.sections) writeSection(out, section);
+    out << "</main>\n<footer>Each card shows the target brought back to RGB, then its components in gray. Times are "
+           "the "
+           "best of several calls; rates count the bytes read and written.</footer>\n</body>\n</html>\n";
+    return out.str();
+}
+
+} // namespace tool

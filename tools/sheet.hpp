@@ -1,0 +1,49 @@
+// The contact sheet as a page of HTML.
+#pragma once
+
+#include "catalog.hpp"
+
+#include <string>
+#include <vector>
+
+namespace tool
+{
+
+/// A picture beside the page.
+struct Shown {
+    std::string file; ///< empty if there is nothing to show
+    RoiSize size = {0, 0};
+};
+
+struct Card {
+    const catalog::Export* entry = nullptr;
+    Shown picture;
+    Shown tiles;
+    std::vector<std::string_view> components; ///< what the tiles show
+    bool called = false;                      ///< there was a way to its source
+    PyxStatus status = 0;
+    RoiSize size = {0, 0}; ///< of the region
+    double seconds = 0;    ///< of a call
+    double bytes = 0;      ///< read and written by a call
+    std::string way;       ///< how the source was made, and the picture from the target
+};
+
+struct Section {
+    const catalog::FamilyInfo* family = nullptr;
+    std::vector<Card> cards;
+};
+
+struct Sheet {
+    std::string title;
+    Shown picture;
+    RoiSize size = {0, 0}; ///< of the whole picture
+    std::vector<Section> sections;
+};
+
+std::string html(const Sheet& sheet);
+
+/// "0.123 ms" and "3.45 GB/s"
+std::string timeText(double seconds);
+std::string rateText(double bytes, double seconds);
+
+} // namespace tool
