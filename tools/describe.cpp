@@ -2,6 +2,7 @@
 
 #include "component.hpp"
 #include "status.hpp"
+#include "text.hpp"
 
 #include <algorithm>
 #include <sstream>
@@ -71,9 +72,7 @@ std::string sampleOrder(const Side& side)
                                 : std::vector{names[0], names[1], names[2], names[1]};
     }
     if (side.spareFourth) names[3] = "-";
-    std::string text;
-    for (std::string_view name : names) text += (text.empty() ? "" : " ") + std::string(name);
-    return text;
+    return joined(names, " ");
 }
 
 std::string divided(const std::string& length, int shift)

@@ -1,9 +1,9 @@
 #include "lookup.hpp"
 
 #include "failure.hpp"
+#include "text.hpp"
 
 #include <algorithm>
-#include <cctype>
 #include <numeric>
 
 namespace tool
@@ -11,13 +11,6 @@ namespace tool
 
 namespace
 {
-
-std::string lowered(std::string_view text)
-{
-    std::string lower(text);
-    std::ranges::transform(lower, lower.begin(), [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
-    return lower;
-}
 
 /// Up to three names near to `name`, the nearest first.
 std::vector<std::string_view> near(const std::string& name)
@@ -52,11 +45,9 @@ std::vector<const catalog::Export*> matching(const std::string& filter)
 const catalog::Export& named(const std::string& name)
 {
     if (const catalog::Export* entry = catalog::find(name)) return *entry;
-    std::string suggestion;
-    for (std::string_view candidate : near(name)) {
-        suggestion += (suggestion.empty() ? "; did you mean " : ", ") + std::string(candidate);
-    }
-    fail("no export is called '", name, "'", suggestion.empty() ? "; see pyxcc list" : suggestion + "?");
+    const auto candidates = near(name);
+    if (candidates.empty()) fail("no export is called '", name, "'; see pyxcc list");
+    fail("no export is called '", name, "'; did you mean ", joined(candidates, ", "), "?");
 }
 
 int editDistance(std::string_view a, std::string_view b)

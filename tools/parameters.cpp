@@ -1,6 +1,7 @@
 #include "parameters.hpp"
 
 #include "failure.hpp"
+#include "text.hpp"
 
 #include <algorithm>
 #include <charconv>
@@ -17,11 +18,9 @@ using catalog::Parameter;
 
 std::string namesOf(const catalog::Export& entry)
 {
-    std::string names;
-    for (int index = 0; index < entry.parameterCount; ++index) {
-        names += (index == 0 ? "" : ", ") + std::string(entry.traits.parameters[index].name);
-    }
-    return names;
+    std::vector<std::string_view> names;
+    for (int index = 0; index < entry.parameterCount; ++index) names.push_back(entry.traits.parameters[index].name);
+    return joined(names, ", ");
 }
 
 int countOf(const Parameter& parameter) { return std::max(parameter.count, 1); }

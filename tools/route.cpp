@@ -1,6 +1,7 @@
 #include "route.hpp"
 
 #include "repack.hpp"
+#include "text.hpp"
 
 #include <algorithm>
 #include <deque>
@@ -120,12 +121,11 @@ std::optional<Route> Graph::search(int from, int to, bool faithful) const
 
 std::string describe(const Route& route)
 {
-    std::string text;
+    std::vector<std::string> steps;
     for (const RouteStep& step : route) {
-        if (!text.empty()) text += ", ";
-        text += step.entry != nullptr ? std::string(step.entry->name) : "repacked as " + nameOf(step.to);
+        steps.push_back(step.entry != nullptr ? std::string(step.entry->name) : "repacked as " + nameOf(step.to));
     }
-    return text;
+    return joined(steps, ", ");
 }
 
 } // namespace tool

@@ -7,9 +7,8 @@
 #include "preview.hpp"
 #include "sheet.hpp"
 #include "status.hpp"
+#include "text.hpp"
 
-#include <algorithm>
-#include <cctype>
 #include <ostream>
 
 namespace tool
@@ -20,13 +19,7 @@ namespace
 
 constexpr double secondsOfCalls = 0.1;
 
-bool isPngName(const fs::path& path)
-{
-    std::string extension = path.extension().string();
-    std::ranges::transform(extension, extension.begin(),
-                           [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
-    return extension == ".png";
-}
+bool isPngName(const fs::path& path) { return lowered(path.extension().string()) == ".png"; }
 
 /// As a picture again, or as its components in gray where no way leads back.
 Image pictureOf(const Graph& graph, const Image& image, std::string& way)

@@ -127,7 +127,8 @@ void writeCard(std::ostream& out, const Card& card)
         }
         out << "<span>" << card.size.width << " × " << card.size.height << "</span></p>\n";
     }
-    if (!card.way.empty()) out << "<p class=\"way\">" << escaped(card.way) << "</p>\n";
+    if (!card.madeBy.empty()) out << "<p class=\"way\">Source by " << escaped(card.madeBy) << "</p>\n";
+    if (!card.shownBy.empty()) out << "<p class=\"way\">Shown by " << escaped(card.shownBy) << "</p>\n";
     out << "</div>\n</article>\n";
 }
 

@@ -20,12 +20,14 @@ struct Card {
     Shown picture;
     Shown tiles;
     std::vector<std::string_view> components; ///< what the tiles show
-    bool called = false;                      ///< there was a way to its source
+    bool called = false;
     PyxStatus status = 0;
     RoiSize size = {0, 0}; ///< of the region
     double seconds = 0;    ///< of a call
     double bytes = 0;      ///< read and written by a call
-    std::string way;       ///< how the source was made, and the picture from the target
+    std::string madeBy;    ///< how the source was made from the picture
+    std::string shownBy;   ///< how the target was brought back
+    std::string note;      ///< why there is nothing to see
 };
 
 struct Section {

@@ -46,23 +46,37 @@ public:
         card.entry = &entry;
         card.size = wholeBlocks(entry.traits.minimum, picture_.size());
         const auto way = graph_.find(picture_.format(), sourceOf(entry));
-        if (!way || card.size.width < 1 || card.size.height < 1) return card;
+        if (!way) {
+            card.note = "No conversion makes its source yet.";
+            return card;
+        }
         try {
-            const Image source = follow(*way, cropped(picture_, card.size));
-            const Measured done = measure(entry, source, Parameters(entry), secondsForEach);
-            card.called = true;
-            card.status = done.status;
-            card.seconds = done.seconds;
-            card.bytes = done.bytes;
-            if (!way->empty()) card.way = "Source: " + describe(*way) + ".";
-            if (done.status >= 0) showTarget(card, done.target);
+            checkSize(card.size.width, card.size.height, "the part of the picture that it takes");
+            call(card, *way);
         } catch (const Failure& failure) {
-            card.way = failure.what();
+            card.note = failure.what();
         }
         return card;
     }
 
 private:
+    void call(Card& card, const Route& way) const
+    {
+        const catalog::Export& entry = *card.entry;
+        const Image source = follow(way, cropped(picture_, card.size));
+        const Measured done = measure(entry, source, Parameters(entry), secondsForEach);
+        card.called = true;
+        card.status = done.status;
+        card.seconds = done.seconds;
+        card.bytes = done.bytes;
+        card.madeBy = describe(way);
+        if (done.status < 0) {
+            card.note = "Nothing was written.";
+        } else {
+            showTarget(card, done.target);
+        }
+    }
+
     void showTarget(Card& card, const Image& target) const
     {
         const std::string name(card.entry->name);
@@ -73,8 +87,7 @@ private:
         const auto back = wayToPicture(graph_, target.format());
         if (!back) return;
         card.picture = show(name + ".png", scaledDown(follow(*back, target), pictureBox));
-        if (!back->empty())
-            card.way += (card.way.empty() ? "" : " ") + std::string("Shown by: ") + describe(*back) + ".";
+        card.shownBy = describe(*back);
     }
 
     const Image& picture_;
