@@ -22,6 +22,8 @@ template <class Work> decltype(auto) withType(Element element, Work work)
         return work(s8{});
     case Element::u16:
         return work(u16{});
+    case Element::u32:
+        return work(u32{});
     case Element::s16:
         return work(s16{});
     case Element::s32:

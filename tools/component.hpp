@@ -6,9 +6,7 @@
 namespace tool
 {
 
-struct Range {
-    double low, high;
-};
+using catalog::Range;
 
 /// What an integer can hold; 0 to 1 for a float.
 Range rangeOf(catalog::Element element);

@@ -15,7 +15,6 @@ namespace
 
 using catalog::Arrangement;
 using catalog::Minimum;
-using catalog::Order;
 using catalog::Side;
 using catalog::Steps;
 
@@ -92,7 +91,8 @@ std::string stepWords(const Side& side)
     }
 }
 
-std::string shapeWords(const Side& side)
+/// `range` is that of the samples; an empty one means the usual.
+std::string shapeWords(const Side& side, Range range)
 {
     const std::string full = "width x height";
     const std::string chroma = divided("width", side.chromaX) + " x " + divided("height", side.chromaY);
@@ -119,24 +119,42 @@ std::string shapeWords(const Side& side)
             if (side.chromaX + side.chromaY > 0) text << " (" << (shared ? chroma : full) << ")";
         }
     }
-    const Range range = rangeOf(side.element);
+    if (range.low == range.high) range = rangeOf(side.element);
     if (!isPacked(side)) text << "; " << range.low << " to " << range.high;
     text << "; " << stepWords(side);
     return text.str();
 }
 
+bool testsParameters(const catalog::Export& entry)
+{
+    return std::ranges::any_of(entry.traits.parameters, [](const auto& p) { return p.status != pyxOk; });
+}
+
 std::string orderWords(const catalog::Export& entry)
 {
     const bool planar = entry.source.planes + entry.target.planes > 2;
-    std::string text;
-    switch (entry.traits.order) {
-    case Order::pointersElementsSize:
-        text = planar ? "null pointers, null planes, size" : "null pointers, size";
-        break;
-    case Order::pointersSizeElements:
-        text = "null pointers, size, null planes";
-        break;
+    std::vector<std::string_view> words;
+    for (const catalog::Check check : catalog::checksOf(entry.traits.order)) {
+        using enum catalog::Check;
+        switch (check) {
+        case pointers:
+            words.push_back("null pointers");
+            break;
+        case elements:
+            if (planar) words.push_back("null planes");
+            break;
+        case size:
+            words.push_back("size");
+            break;
+        case steps:
+            if (entry.traits.stepsTested) words.push_back("steps");
+            break;
+        case parameters:
+            if (testsParameters(entry)) words.push_back("parameters");
+            break;
+        }
     }
+    std::string text = joined(words, ", ");
     if (entry.traits.untested == catalog::Untested::targetArray) text += "; the target's array of planes is not tested";
     return text;
 }
@@ -208,8 +226,9 @@ std::string sheetOf(const catalog::Export& entry)
     const auto line = [&text](std::string_view label, const std::string& words) {
         text << "  " << label << std::string(12 - label.size(), ' ') << words << "\n";
     };
-    line(entry.inPlace ? "image" : "source", nameOf(entry.source) + ": " + shapeWords(entry.source));
-    if (!entry.inPlace) line("target", nameOf(entry.target) + ": " + shapeWords(entry.target));
+    line(entry.inPlace ? "image" : "source",
+         nameOf(entry.source) + ": " + shapeWords(entry.source, entry.traits.range));
+    if (!entry.inPlace) line("target", nameOf(entry.target) + ": " + shapeWords(entry.target, {}));
     for (int index = 0; index < entry.parameterCount; ++index) {
         line(index == 0 ? "parameters" : "", parameterWords(entry.traits.parameters[index]));
     }

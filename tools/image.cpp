@@ -19,14 +19,6 @@ catalog::PlaneShape roomOf(const catalog::Side& side, int plane, RoiSize size)
     return catalog::shapeOf(side, plane, {roundUp(size.width, 4), roundUp(size.height, 4)});
 }
 
-/// Without steps, a chroma row of a 4:2:2 image counts the last odd column, one of a 4:2:0 image does not.
-int tightStep(const catalog::Side& side, int plane, RoiSize size)
-{
-    const int width = side.chromaY == 0 ? roundUp(size.width, 1 << side.chromaX) : size.width;
-    return plane == 0 ? catalog::shapeOf(side, 0, size).rowBytes
-                      : catalog::shapeOf(side, plane, {width, size.height}).rowBytes;
-}
-
 } // namespace
 
 Image::Image(Format format, RoiSize size, Rows rows) : format_(std::move(format)), size_(size)
@@ -34,7 +26,8 @@ Image::Image(Format format, RoiSize size, Rows rows) : format_(std::move(format)
     std::size_t total = 0;
     for (int plane = 0; plane < planes(); ++plane) {
         const catalog::PlaneShape room = roomOf(side(), plane, size);
-        step_[plane] = rows == Rows::tight ? tightStep(side(), plane, size) : roundUp(room.rowBytes, lineBytes);
+        step_[plane] =
+            rows == Rows::tight ? catalog::shapeOf(side(), plane, size).rowBytes : roundUp(room.rowBytes, lineBytes);
         offset_[plane] = total;
         const std::size_t span = std::max(step_[plane], room.rowBytes);
         total += (span * room.rows + lineBytes - 1) / lineBytes * lineBytes;

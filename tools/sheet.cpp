@@ -31,12 +31,18 @@ body > * { max-width: 1600px; margin-inline: auto; padding-inline: clamp(12px, 2
 a { color: var(--link); }
 h1 { margin: 0 0 4px; font-size: clamp(1.4rem, 4vw, 2rem); line-height: 1.2; }
 h2 { margin: 0; font-size: 1.3rem; line-height: 1.3; }
+h2 a { margin-left: 10px; font-size: 0.85rem; font-weight: 400; white-space: nowrap; }
 h3 { margin: 0; font: 600 0.86rem/1.35 ui-monospace, monospace; overflow-wrap: anywhere; }
 p { margin: 0; }
 header { display: flex; flex-wrap: wrap; gap: 16px 28px; align-items: center; padding-block: 24px 16px; }
 header img { width: min(100%, 300px); height: auto; border-radius: 8px; }
 header p, .about { color: var(--soft); }
 nav { padding-block: 8px 16px; border-bottom: 1px solid var(--line); }
+nav input {
+  width: min(100%, 26rem); margin-bottom: 10px; padding: 8px 10px; font: inherit; color: inherit;
+  background: var(--card); border: 1px solid var(--line); border-radius: 8px;
+}
+[hidden] { display: none; }
 nav ul { list-style: none; margin: 0; padding: 0; columns: 270px; column-gap: 28px; }
 nav li { display: flex; justify-content: space-between; gap: 10px; padding: 4px 0; break-inside: avoid; }
 nav li span { color: var(--soft); font-variant-numeric: tabular-nums; }
@@ -48,7 +54,7 @@ article {
   overflow: hidden; content-visibility: auto; contain-intrinsic-size: auto 430px;
 }
 article img { display: block; width: 100%; height: auto; }
-.parts { padding: 8px 12px 0; }
+.parts { padding: 10px 12px 4px; background: var(--page); }
 .names { display: flex; color: var(--soft); font-size: 0.78rem; }
 .names span { flex: 1; text-align: center; }
 .text { display: flex; flex-direction: column; gap: 3px; padding: 10px 12px 12px; }
@@ -59,6 +65,20 @@ article img { display: block; width: 100%; height: auto; }
 .good { color: var(--good); } .warn { color: var(--warn); } .bad { color: var(--bad); }
 .none { display: grid; place-items: center; min-height: 90px; padding: 12px; color: var(--soft); font-size: 0.88rem; }
 footer { padding-block: 24px 40px; color: var(--soft); font-size: 0.88rem; }
+)";
+
+/// Shows the cards with the text in their names, and the families that have any.
+constexpr std::string_view script = R"(
+const find = document.querySelector("nav input");
+find.hidden = false;
+find.addEventListener("input", () => {
+  const wanted = find.value.trim().toLowerCase();
+  for (const section of document.querySelectorAll("section")) {
+    const cards = [...section.querySelectorAll("article")];
+    for (const card of cards) card.hidden = !card.id.toLowerCase().includes(wanted);
+    section.hidden = cards.every((card) => card.hidden);
+  }
+});
 )";
 
 std::string escaped(std::string_view text)
@@ -101,15 +121,15 @@ std::string arrowed(const std::string& conversion)
 
 std::string_view toneOf(PyxStatus status) { return status < 0 ? "bad" : status > 0 ? "warn" : "good"; }
 
-void writeCard(std::ostream& out, const Card& card)
+/// `whole` is the size of the picture, of which a conversion may have taken a part.
+void writeCard(std::ostream& out, const Card& card, RoiSize whole)
 {
     const std::string name(card.entry->name);
     out << "<article id=\"" << name << "\">\n";
     if (!card.picture.file.empty()) {
         out << image(card.picture, "The picture after " + name) << "\n";
     } else if (card.tiles.file.empty()) {
-        out << "<div class=\"none\">" << (card.called ? "Nothing was written." : "No way to its source yet.")
-            << "</div>\n";
+        out << "<div class=\"none\">" << escaped(card.note) << "</div>\n";
     }
     if (!card.tiles.file.empty()) {
         out << "<div class=\"parts\">" << image(card.tiles, "The components of the target") << "<div class=\"names\">";
@@ -125,16 +145,20 @@ void writeCard(std::ostream& out, const Card& card)
             out << "<span>" << timeText(card.seconds) << "</span><span>" << rateText(card.bytes, card.seconds)
                 << "</span>";
         }
-        out << "<span>" << card.size.width << " × " << card.size.height << "</span></p>\n";
+        if (card.size.width != whole.width || card.size.height != whole.height) {
+            out << "<span>" << card.size.width << " × " << card.size.height << "</span>";
+        }
+        out << "</p>\n";
     }
-    if (!card.madeBy.empty()) out << "<p class=\"way\">Source by " << escaped(card.madeBy) << "</p>\n";
-    if (!card.shownBy.empty()) out << "<p class=\"way\">Shown by " << escaped(card.shownBy) << "</p>\n";
+    if (!card.madeBy.empty()) out << "<p class=\"way\">Source: " << escaped(card.madeBy) << "</p>\n";
+    if (!card.shownBy.empty()) out << "<p class=\"way\">Shown: " << escaped(card.shownBy) << "</p>\n";
     out << "</div>\n</article>\n";
 }
 
 void writeIndex(std::ostream& out, const Sheet& sheet)
 {
-    out << "<nav aria-label=\"Families\">\n<ul>\n";
+    out << "<nav aria-label=\"Families\" id=\"index\">\n"
+        << "<input type=\"search\" placeholder=\"A part of a name\" aria-label=\"A part of a name\" hidden>\n<ul>\n";
     for (const Section& section : sheet.sections) {
         out << "<li><a href=\"#" << section.family->slug << "\">" << escaped(section.family->title) << "</a> <span>"
             << section.cards.size() << "</span></li>\n";
@@ -142,11 +166,12 @@ void writeIndex(std::ostream& out, const Sheet& sheet)
     out << "</ul>\n</nav>\n";
 }
 
-void writeSection(std::ostream& out, const Section& section)
+void writeSection(std::ostream& out, const Section& section, RoiSize whole)
 {
     out << "<section id=\"" << section.family->slug << "\">\n<h2>" << escaped(section.family->title)
-        << "</h2>\n<p class=\"about\">" << escaped(section.family->text) << "</p>\n<div class=\"cards\">\n";
-    for (const Card& card : section.cards) writeCard(out, card);
+        << " <a href=\"#index\">Index</a></h2>\n<p class=\"about\">" << escaped(section.family->text)
+        << "</p>\n<div class=\"cards\">\n";
+    for (const Card& card : section.cards) writeCard(out, card, whole);
     out << "</div>\n</section>\n";
 }
 
@@ -184,10 +209,11 @@ std::string html(const Sheet& sheet)
         << "</p>\n</div>\n</header>\n";
     writeIndex(out, sheet);
     out << "<main>\n";
-    for (const Section& section : sheet.sections) writeSection(out, section);
+    for (const Section& section : sheet.sections) writeSection(out, section, sheet.size);
     out << "</main>\n<footer>Each card shows the target brought back to RGB, then its components in gray. Times are "
            "the "
-           "best of several calls; rates count the bytes read and written.</footer>\n</body>\n</html>\n";
+           "best of several calls; rates count the bytes read and written.</footer>\n<script>"
+        << script << "</script>\n</body>\n</html>\n";
     return out.str();
 }
 
