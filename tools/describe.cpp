@@ -132,7 +132,8 @@ bool testsParameters(const catalog::Export& entry)
 
 std::string orderWords(const catalog::Export& entry)
 {
-    const bool planar = entry.source.planes + entry.target.planes > 2;
+    const bool arrays =
+        entry.source.arrangement == Arrangement::planar || entry.target.arrangement == Arrangement::planar;
     std::vector<std::string_view> words;
     for (const catalog::Check check : catalog::checksOf(entry.traits.order)) {
         using enum catalog::Check;
@@ -141,7 +142,7 @@ std::string orderWords(const catalog::Export& entry)
             words.push_back("null pointers");
             break;
         case elements:
-            if (planar) words.push_back("null planes");
+            if (arrays) words.push_back("null planes");
             break;
         case size:
             words.push_back("size");

@@ -1,6 +1,7 @@
 #include "preview.hpp"
 
 #include "component.hpp"
+#include "repack.hpp"
 
 #include <algorithm>
 #include <cmath>
@@ -94,6 +95,12 @@ Image scaledDown(const Image& image, RoiSize box)
         resample(component(image, channel), result.size(), [&](int x, int y, double mean) { target.set(x, y, mean); });
     }
     return result;
+}
+
+Image eightBit(const Image& image)
+{
+    const catalog::Side& side = image.side();
+    return repack(image, {catalog::sideOf(side.model, side.layout, Element::u8), {}});
 }
 
 Image componentTiles(const Image& image, RoiSize tile)

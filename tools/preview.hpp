@@ -21,6 +21,9 @@ RoiSize fitted(RoiSize shape, RoiSize box);
 /// `image` is interleaved RGB or gray.
 Image scaledDown(const Image& image, RoiSize box);
 
+/// With samples of 8 bits; `image` is RGB or gray.
+Image eightBit(const Image& image);
+
 /// The components from left to right in gray, each in a tile of that size, with clear gaps between. Where the model
 /// fixes no black and white, the smallest and the largest value are shown so.
 Image componentTiles(const Image& image, RoiSize tile);

@@ -14,15 +14,25 @@ namespace
 
 using catalog::Element;
 
-/// Converts a picture to another model or layout, rather than working on it within one.
+/// Converts a picture to another model or layout, rather than working on it within one. Those without steps have
+/// siblings with them.
 bool converts(const catalog::Export& entry)
 {
-    return !entry.inPlace && !entry.source.model.empty() && !entry.target.model.empty();
+    return !entry.inPlace && !entry.stepless && !entry.source.model.empty() && !entry.target.model.empty();
 }
 
-/// A flavour of a conversion that does more to the picture than its plain sibling.
+bool isSubsampled(const catalog::Side& side) { return side.chromaX + side.chromaY > 0; }
+
+bool resamples(const catalog::Export& entry)
+{
+    const catalog::Side &a = entry.source, &b = entry.target;
+    return isSubsampled(a) && isSubsampled(b) && (a.chromaX != b.chromaX || a.chromaY != b.chromaY);
+}
+
+/// Does more to the picture than a plain conversion.
 bool changesPicture(const catalog::Export& entry)
 {
+    if (resamples(entry) || (entry.parameterCount > 0 && entry.parameterTypes[0].pointer)) return true;
     return std::ranges::any_of(std::initializer_list<std::string_view>{"Dither", "Filter", "Gamma", "Interlace"},
                                [&](std::string_view variant) { return entry.variant == variant; });
 }

@@ -4,7 +4,6 @@
 #include "failure.hpp"
 #include "image_file.hpp"
 #include "preview.hpp"
-#include "repack.hpp"
 #include "sheet.hpp"
 
 #include <algorithm>
@@ -86,7 +85,7 @@ private:
         card.tiles = show(name + ".parts.png", componentTiles(target, tile));
         const auto back = wayToPicture(graph_, target.format());
         if (!back) return;
-        card.picture = show(name + ".png", scaledDown(follow(*back, target), pictureBox));
+        card.picture = show(name + ".png", eightBit(scaledDown(follow(*back, target), pictureBox)));
         card.shownBy = describe(*back);
     }
 
@@ -103,7 +102,7 @@ void writeTour(const Image& picture, const std::string& title, std::span<const c
     StagedDirectory staged(directory);
     const Tour tour(picture, staged);
     Sheet sheet{title, {}, picture.size(), {}};
-    sheet.picture = tour.show("picture.png", scaledDown(repack(picture, pictureFormat(picture.format())), pictureBox));
+    sheet.picture = tour.show("picture.png", eightBit(scaledDown(picture, pictureBox)));
     for (const catalog::FamilyInfo& family : catalog::families()) {
         Section section{&family, {}};
         for (const catalog::Export* entry : exports) {
