@@ -4,6 +4,7 @@
 
 #include "layouts/rows.hpp"
 
+#include <array>
 #include <type_traits>
 
 namespace pyxcc::layouts
@@ -15,17 +16,19 @@ template <class Packing, class Byte> struct InterleavedImage {
     Packing packing;
 
     PYXCC_INLINE auto row(int y) const { return InterleavedRow<Packing, Byte>{rowAt(first, step, y), packing}; }
+
+    /// Rows 2 j and 2 j + 1.
+    PYXCC_INLINE auto rowPair(int j) const { return RowPair{row(2 * j), row(2 * j + 1)}; }
 };
 
-template <class Samples, int Count, class Byte> struct PlanarImage {
-    std::array<Byte*, Count> first;
-    std::array<std::ptrdiff_t, Count> step;
+template <class Samples, class Byte> struct PlanarImage {
+    std::array<Byte*, 3> first;
+    std::array<std::ptrdiff_t, 3> step;
 
     PYXCC_INLINE auto row(int y) const
     {
-        PlanarRow<Samples, Count, Byte> row;
-        for (int i = 0; i < Count; ++i) row.at[i] = rowAt(first[i], step[i], y);
-        return row;
+        const auto plane = [&](int i) PYXCC_INLINE_LAMBDA { return rowAt(first[i], step[i], y); };
+        return PlanarRow<Samples, Byte>{{plane(0)}, {plane(1)}, {plane(2)}};
     }
 };
 
@@ -68,7 +71,7 @@ template <class Sample> auto c4(Sample* first, int step, std::type_identity_t<Sa
 /// Three planes with one step.
 template <class Sample> auto p3(Sample* const planes[3], int step)
 {
-    return PlanarImage<detail::RegisterOf<Sample>, 3, detail::ByteOf<Sample>>{
+    return PlanarImage<detail::RegisterOf<Sample>, detail::ByteOf<Sample>>{
         {bytes(planes[0]), bytes(planes[1]), bytes(planes[2])}, {step, step, step}};
 }
 

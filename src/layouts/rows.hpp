@@ -7,8 +7,6 @@
 #include "layouts/avx2/interleave.hpp"
 #include "layouts/bytes.hpp"
 
-#include <array>
-
 namespace pyxcc::layouts
 {
 
@@ -105,55 +103,81 @@ private:
     PYXCC_INLINE Byte* pixel(int x) const { return at + static_cast<std::ptrdiff_t>(x) * pixelBytes; }
 };
 
-/// A row of each of several planes of samples, all of one width.
-template <class Samples, int Count, class Byte> struct PlanarRow {
+/// A row of one plane of samples.
+template <class Samples, class Byte> struct SampleRow {
     static constexpr int block = Samples::count;
-    std::array<Byte*, Count> at;
+    Byte* at;
 
-    PYXCC_INLINE Three<Samples> load(int x) const
+    PYXCC_INLINE Samples load(int x) const { return loadSamples<Samples>(sample(x)); }
+
+    PYXCC_INLINE Samples load(int x, int count) const
     {
-        return {loadSamples<Samples>(sample(0, x)), loadSamples<Samples>(sample(1, x)),
-                loadSamples<Samples>(sample(2, x))};
+        alignas(32) u8 buffer[32] = {};
+        copyBytes(buffer, sample(x), count * sampleBytes<Samples>);
+        return loadSamples<Samples>(buffer);
     }
+
+    PYXCC_INLINE void store(int x, Samples samples) const { storeSamples(sample(x), samples); }
+
+    PYXCC_INLINE void store(int x, int count, Samples samples) const
+    {
+        alignas(32) u8 buffer[32];
+        storeSamples(buffer, samples);
+        copyBytes(sample(x), buffer, count * sampleBytes<Samples>);
+    }
+
+private:
+    PYXCC_INLINE Byte* sample(int x) const { return at + static_cast<std::ptrdiff_t>(x) * sampleBytes<Samples>; }
+};
+
+/// A row of each of three planes of samples, all of one width.
+template <class Samples, class Byte> struct PlanarRow {
+    static constexpr int block = Samples::count;
+    SampleRow<Samples, Byte> a, b, c;
+
+    PYXCC_INLINE Three<Samples> load(int x) const { return {a.load(x), b.load(x), c.load(x)}; }
 
     PYXCC_INLINE Three<Samples> load(int x, int count) const
     {
-        return {loadPart(sample(0, x), count), loadPart(sample(1, x), count), loadPart(sample(2, x), count)};
+        return {a.load(x, count), b.load(x, count), c.load(x, count)};
     }
 
     PYXCC_INLINE void store(int x, const Three<Samples>& pixels) const
     {
-        storeSamples(sample(0, x), pixels.a);
-        storeSamples(sample(1, x), pixels.b);
-        storeSamples(sample(2, x), pixels.c);
+        a.store(x, pixels.a);
+        b.store(x, pixels.b);
+        c.store(x, pixels.c);
     }
 
     PYXCC_INLINE void store(int x, int count, const Three<Samples>& pixels) const
     {
-        storePart(sample(0, x), count, pixels.a);
-        storePart(sample(1, x), count, pixels.b);
-        storePart(sample(2, x), count, pixels.c);
-    }
-
-private:
-    PYXCC_INLINE Byte* sample(int plane, int x) const
-    {
-        return at[plane] + static_cast<std::ptrdiff_t>(x) * sampleBytes<Samples>;
-    }
-
-    static PYXCC_INLINE Samples loadPart(const u8* p, int count)
-    {
-        alignas(32) u8 buffer[32] = {};
-        copyBytes(buffer, p, count * sampleBytes<Samples>);
-        return loadSamples<Samples>(buffer);
-    }
-
-    static PYXCC_INLINE void storePart(u8* p, int count, Samples samples)
-    {
-        alignas(32) u8 buffer[32];
-        storeSamples(buffer, samples);
-        copyBytes(p, buffer, count * sampleBytes<Samples>);
+        a.store(x, count, pixels.a);
+        b.store(x, count, pixels.b);
+        c.store(x, count, pixels.c);
     }
 };
+
+/// Two rows that are read or written together.
+template <class Row> struct RowPair {
+    static constexpr int block = Row::block;
+    Row upper, lower;
+
+    PYXCC_INLINE auto load(int x) const { return Two{upper.load(x), lower.load(x)}; }
+    PYXCC_INLINE auto load(int x, int count) const { return Two{upper.load(x, count), lower.load(x, count)}; }
+
+    template <class Pixels> PYXCC_INLINE void store(int x, const Two<Pixels>& pixels) const
+    {
+        upper.store(x, pixels.a);
+        lower.store(x, pixels.b);
+    }
+
+    template <class Pixels> PYXCC_INLINE void store(int x, int count, const Two<Pixels>& pixels) const
+    {
+        upper.store(x, count, pixels.a);
+        lower.store(x, count, pixels.b);
+    }
+};
+
+template <class Row> RowPair(Row, Row) -> RowPair<Row>;
 
 } // namespace pyxcc::layouts
