@@ -10,13 +10,13 @@ template <class Form> class Bt601Form : public testing::Test
 };
 
 using namespace pyxcc::matrix;
-using Forms = testing::Types<FwdExact, FwdHigh, FwdRound, InvExactA, InvExactB, InvExactC, InvExactD, InvHighA, InvHighB,
-                             InvHighC, InvHighD>;
+using Forms = testing::Types<FwdExact, FwdHigh, FwdRound, InvExactA, InvExactB, InvExactC, InvExactD, InvHighA,
+                             InvHighB, InvHighC, InvHighD>;
 
 struct Names {
     template <class Form> static std::string GetName(int i)
     {
-        return std::array{"fwdExact",  "fwdHigh",   "fwdRound", "invExactA", "invExactB", "invExactC",
+        return std::array{"fwdExact",  "fwdHigh",  "fwdRound", "invExactA", "invExactB", "invExactC",
                           "invExactD", "invHighA", "invHighB", "invHighC",  "invHighD"}[i];
     }
 };

@@ -24,18 +24,19 @@ template <class Form> void expectInstancesAgree(const Form& form)
                 a.fill(static_cast<u8>(first));
                 b.fill(static_cast<u8>(second));
                 for (int i = 0; i < block; ++i) c[i] = static_cast<u8>(third + i);
-                const auto wide = pyxcc::frame::apply(
-                    form, Three{pyxcc::layouts::loadSamples(a.data()), pyxcc::layouts::loadSamples(b.data()),
-                                pyxcc::layouts::loadSamples(c.data())});
+                const auto wide = pyxcc::frame::apply(form, Three{pyxcc::layouts::loadSamples(a.data()),
+                                                                  pyxcc::layouts::loadSamples(b.data()),
+                                                                  pyxcc::layouts::loadSamples(c.data())});
                 pyxcc::layouts::storeSamples(x.data(), wide.a);
                 pyxcc::layouts::storeSamples(y.data(), wide.b);
                 pyxcc::layouts::storeSamples(z.data(), wide.c);
                 for (int i = 0; i < block; ++i) {
                     const auto one = form(S16(first), S16(second), S16(third + i));
                     const bool same = x[i] == one.a.v && y[i] == one.b.v && z[i] == one.c.v;
-                    ASSERT_TRUE(same) << "of (" << first << ", " << second << ", " << third + i << ") a register makes ("
-                                      << int{x[i]} << ", " << int{y[i]} << ", " << int{z[i]} << "), one value ("
-                                      << int{one.a.v} << ", " << int{one.b.v} << ", " << int{one.c.v} << ")";
+                    ASSERT_TRUE(same) << "of (" << first << ", " << second << ", " << third + i
+                                      << ") a register makes (" << int{x[i]} << ", " << int{y[i]} << ", " << int{z[i]}
+                                      << "), one value (" << int{one.a.v} << ", " << int{one.b.v} << ", "
+                                      << int{one.c.v} << ")";
                 }
             }
         }
