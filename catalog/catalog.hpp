@@ -52,8 +52,11 @@ std::span<const Check> checksOf(Order order);
 /// Pointers that an export does not test, so that a null one must not be passed.
 enum class Untested { none, targetArray };
 
-/// When the work is done and pyxWarnOddSize comes back all the same.
-enum class Warning { never, oddWidth, oddSize };
+/// The chroma block: when the size is not a multiple of it, the work is done and pyxWarnOddSize comes back.
+struct Warning {
+    int widthMultiple = 1;
+    int heightMultiple = 1;
+};
 
 /// The smallest size, and what the size must be a multiple of. A minimum of `any` is not tested at all.
 struct Minimum {
@@ -94,7 +97,7 @@ struct Traits {
     Order order = Order::pointersElementsSize;
     Untested untested = Untested::none;
     Minimum minimum = {};
-    Warning warning = Warning::never;
+    Warning warning = {};
     std::array<Parameter, 4> parameters = {}; ///< a lone number that is not named here is `aval`
     bool stepsTested = false;                 ///< a step below 1 yields pyxErrStep
     bool sourceChromaUp = false;              ///< the source has a chroma sample for a part of a block, too

@@ -167,21 +167,23 @@ std::string bound(int least, int multiple)
     return "at least " + std::to_string(least) + (multiple > 1 ? ", a multiple of " + std::to_string(multiple) : "");
 }
 
+/// "an odd width", "a height that is not a multiple of 4"
+std::string offBlock(const std::string& length, int multiple)
+{
+    if (multiple == 2) return "an odd " + length;
+    return "a " + length + " that is not a multiple of " + std::to_string(multiple);
+}
+
 std::string statusWords(const catalog::Export& entry)
 {
     const Minimum& minimum = entry.traits.minimum;
     std::string text = statusText(pyxOk) + ", " + statusText(pyxErrNullPtr);
     if (minimum.width != Minimum::any || minimum.height != Minimum::any) text += ", " + statusText(pyxErrSize);
-    switch (entry.traits.warning) {
-    case catalog::Warning::never:
-        break;
-    case catalog::Warning::oddWidth:
-        text += ", " + statusText(pyxWarnOddSize) + " for an odd width";
-        break;
-    case catalog::Warning::oddSize:
-        text += ", " + statusText(pyxWarnOddSize) + " for an odd width or height";
-        break;
-    }
+    std::vector<std::string> off;
+    const auto& [widthMultiple, heightMultiple] = entry.traits.warning;
+    if (widthMultiple > 1) off.push_back(offBlock("width", widthMultiple));
+    if (heightMultiple > 1) off.push_back(offBlock("height", heightMultiple));
+    if (!off.empty()) text += ", " + statusText(pyxWarnOddSize) + " for " + joined(off, " or ");
     return text;
 }
 

@@ -100,16 +100,7 @@ PyxStatus check(catalog::Check what, const Export& entry, const Invocation& call
 
 bool warns(catalog::Warning warning, RoiSize roi)
 {
-    const bool oddWidth = roi.width % 2 != 0, oddHeight = roi.height % 2 != 0;
-    switch (warning) {
-    case catalog::Warning::oddWidth:
-        return oddWidth;
-    case catalog::Warning::oddSize:
-        return oddWidth || oddHeight;
-    case catalog::Warning::never:
-        break;
-    }
-    return false;
+    return roi.width % warning.widthMultiple != 0 || roi.height % warning.heightMultiple != 0;
 }
 
 } // namespace
