@@ -67,6 +67,7 @@ std::vector<Geometry> geometriesOf(const Side& side, RoiSize roi, Stride stride,
                                                      : common;
         geometries.push_back(geometryOf(shape, side.element, step));
     }
+    for (Geometry& geometry : geometries) geometry.low -= side.bytesInFront;
     // Some conversions walk a chroma plane by the step of the other one.
     if (side.steps == Steps::each && side.planes > 2) shareExtent(geometries[1], geometries[2]);
     return geometries;
