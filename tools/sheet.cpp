@@ -67,7 +67,7 @@ article img { display: block; width: 100%; height: auto; }
 footer { padding-block: 24px 40px; color: var(--soft); font-size: 0.88rem; }
 )";
 
-/// Shows the cards with the text in their names, and the families that have any.
+/// Shows the cards with the text in their names or families, and the families that have any.
 constexpr std::string_view script = R"(
 const find = document.querySelector("nav input");
 find.hidden = false;
@@ -75,7 +75,7 @@ find.addEventListener("input", () => {
   const wanted = find.value.trim().toLowerCase();
   for (const section of document.querySelectorAll("section")) {
     const cards = [...section.querySelectorAll("article")];
-    for (const card of cards) card.hidden = !card.id.toLowerCase().includes(wanted);
+    for (const card of cards) card.hidden = !`${section.id} ${card.id}`.toLowerCase().includes(wanted);
     section.hidden = cards.every((card) => card.hidden);
   }
 });
@@ -158,7 +158,7 @@ void writeCard(std::ostream& out, const Card& card, RoiSize whole)
 void writeIndex(std::ostream& out, const Sheet& sheet)
 {
     out << "<nav aria-label=\"Families\" id=\"index\">\n"
-        << "<input type=\"search\" placeholder=\"A part of a name\" aria-label=\"A part of a name\" hidden>\n<ul>\n";
+        << "<input type=\"search\" placeholder=\"A part of a name, or a family\" aria-label=\"A part of a name, or a family\" hidden>\n<ul>\n";
     for (const Section& section : sheet.sections) {
         out << "<li><a href=\"#" << section.family->slug << "\">" << escaped(section.family->title) << "</a> <span>"
             << section.cards.size() << "</span></li>\n";
