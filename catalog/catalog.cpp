@@ -109,10 +109,16 @@ std::span<const Check> checksOf(Order order)
     using enum Check;
     static constexpr Check usual[] = {pointers, elements, size, steps, parameters};
     static constexpr Check elementsLate[] = {pointers, size, elements, steps, parameters};
+    static constexpr Check stepsBeforeSize[] = {pointers, elements, steps, size, parameters};
+    static constexpr Check sizeFirst[] = {size, pointers, elements, steps, parameters};
     static constexpr Check parametersFirst[] = {parameters, pointers, elements, size, steps};
     switch (order) {
     case Order::pointersSizeElements:
         return elementsLate;
+    case Order::stepsBeforeSize:
+        return stepsBeforeSize;
+    case Order::sizeFirst:
+        return sizeFirst;
     case Order::parametersFirst:
         return parametersFirst;
     case Order::pointersElementsSize:

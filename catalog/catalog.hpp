@@ -41,7 +41,9 @@ const FamilyInfo& infoOf(Family family);
 enum class Order {
     pointersElementsSize,
     pointersSizeElements,
-    parametersFirst, ///< then as the first of these
+    stepsBeforeSize, ///< else as the first of these
+    sizeFirst,       ///< then as the first of these
+    parametersFirst, ///< likewise
 };
 
 /// What an order is made of. Steps and parameters are tested only where the traits say so.
@@ -50,7 +52,7 @@ enum class Check { pointers, elements, size, steps, parameters };
 std::span<const Check> checksOf(Order order);
 
 /// Pointers that an export does not test, so that a null one must not be passed.
-enum class Untested { none, targetArray };
+enum class Untested { none, sourceArray, targetArray };
 
 /// The chroma block: when the size is not a multiple of it, the work is done and pyxWarnOddSize comes back.
 struct Warning {

@@ -96,7 +96,8 @@ void addParameters(Faults& faults, const Export& entry)
 Faults faultsOf(const Export& entry)
 {
     const catalog::Traits& traits = entry.traits;
-    const Role source{"source", &Invocation::source, &Invocation::sourceStep, &Invocation::sourceArrayNull, true};
+    const Role source{"source", &Invocation::source, &Invocation::sourceStep, &Invocation::sourceArrayNull,
+                      traits.untested != catalog::Untested::sourceArray};
     const Role target{"target", &Invocation::target, &Invocation::targetStep, &Invocation::targetArrayNull,
                       traits.untested != catalog::Untested::targetArray};
     Faults faults;

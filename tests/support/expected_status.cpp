@@ -26,12 +26,13 @@ bool isArray(const Side& side) { return side.arrangement == Arrangement::planar;
 
 PyxStatus checkPointers(const Export& entry, const Invocation& call)
 {
-    const auto null = [](const Side& side, const auto& planes, bool arrayNull) {
-        return isArray(side) ? arrayNull : anyNull(first(planes, side.planes));
+    const auto null = [&](const Side& side, const auto& planes, bool arrayNull, Untested untested) {
+        if (!isArray(side)) return anyNull(first(planes, side.planes));
+        return arrayNull && entry.traits.untested != untested;
     };
-    bool failed = null(entry.source, call.source, call.sourceArrayNull);
-    if (!entry.inPlace && !(isArray(entry.target) && entry.traits.untested == Untested::targetArray)) {
-        failed = failed || null(entry.target, call.target, call.targetArrayNull);
+    bool failed = null(entry.source, call.source, call.sourceArrayNull, Untested::sourceArray);
+    if (!entry.inPlace) {
+        failed = failed || null(entry.target, call.target, call.targetArrayNull, Untested::targetArray);
     }
     for (int i = 0; i < entry.parameterCount; ++i) {
         failed = failed || (entry.parameterTypes[i].pointer && !call.parameters[i].pointer);
