@@ -3,6 +3,8 @@
 
 #include "lanes/avx2/integers.hpp"
 
+#include <algorithm>
+
 namespace pyxcc::wide
 {
 
@@ -11,15 +13,19 @@ namespace detail
 
 /// A weight beyond 16 bits is taken apart as (whole << shift) + rest, of which a multiply-add takes the rest. The whole
 /// part adds multiples of the lane to the shifted sum; nothing is rounded by that, since before the shift they are
-/// multiples of 1 << shift.
+/// multiples of 1 << shift. A shift of 17 or 18 can leave a rest beyond 16 bits still: the excess takes a multiply-add
+/// more.
 struct SplitWeight {
     int whole;
     int rest;
+    int excess;
 
     constexpr SplitWeight(int weight, int shift)
-        : whole(weight >= -32768 && weight <= 32767 ? 0 : (weight + (1 << (shift - 1))) >> shift),
-          rest(weight - whole * (1 << shift))
+        : whole(weight >= -32768 && weight <= 32767 ? 0 : (weight + (1 << (shift - 1))) >> shift)
     {
+        const int remainder = weight - whole * (1 << shift);
+        rest = std::clamp(remainder, -32768, 32767);
+        excess = remainder - rest;
     }
 };
 
@@ -66,6 +72,12 @@ PYXCC_INLINE void addTerms(Sums& sums, const S16& x, const S16& y, const Lanes&.
     if constexpr (sizeof...(rest) > 0) addTerms<Shift, Addend, Weights...>(sums, rest...);
 }
 
+template <int Shift, int Weight> PYXCC_INLINE void addExcess(Sums& sums, const S16& x)
+{
+    constexpr int excess = SplitWeight(Weight, Shift).excess;
+    if constexpr (excess != 0) sums.add<excess, 0>(x, S16(0));
+}
+
 /// What the whole part of a weight adds to the shifted sum.
 template <int Shift, int Weight> PYXCC_INLINE void addWhole(S16& sum, const S16& x)
 {
@@ -88,6 +100,7 @@ template <int Shift, int Addend, int... Weights, class... Lanes> PYXCC_INLINE S1
     const __m256i start = _mm256_set1_epi32(rides ? 0 : Addend);
     detail::Sums sums{start, start};
     detail::addTerms<Shift, rides ? Addend : 0, Weights...>(sums, lanes...);
+    (detail::addExcess<Shift, Weights>(sums, lanes), ...);
     S16 result(_mm256_packs_epi32(_mm256_srai_epi32(sums.low, Shift), _mm256_srai_epi32(sums.high, Shift)));
     (detail::addWhole<Shift, Weights>(result, lanes), ...);
     return result;

@@ -85,6 +85,10 @@ PYXCC_INLINE S16 asS16(U16 x) { return S16(x.v); }
 
 PYXCC_INLINE Byte sat8(S16 x) { return {x.v}; }
 PYXCC_INLINE Byte sat8(U16 x) { return {_mm256_min_epu16(x.v, _mm256_set1_epi16(255))}; }
+PYXCC_INLINE Byte clampTo(S16 x, int low, int high)
+{
+    return {_mm256_min_epi16(_mm256_max_epi16(x.v, S16(low).v), S16(high).v)};
+}
 PYXCC_INLINE Byte low8(S16 x) { return {_mm256_and_si256(x.v, _mm256_set1_epi16(255))}; }
 
 PYXCC_INLINE S16 mulRound15(S16 x, int k) { return S16(_mm256_mulhrs_epi16(x.v, S16(k).v)); }
