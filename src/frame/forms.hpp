@@ -8,17 +8,20 @@
 namespace pyxcc::frame
 {
 
-/// A form over 16-bit lanes, three samples in and three bytes out.
+/// A form over 16-bit lanes, three samples in and bytes out.
 struct OnWords {
 };
 
-template <std::derived_from<OnWords> Form>
-PYXCC_INLINE Three<wide::U8> apply(const Form& form, const Three<wide::U8>& pixels)
+PYXCC_INLINE wide::U8 narrowAll(wide::Byte low, wide::Byte high) { return narrow(low, high); }
+PYXCC_INLINE Three<wide::U8> narrowAll(const Three<wide::Byte>& low, const Three<wide::Byte>& high)
+{
+    return {narrow(low.a, high.a), narrow(low.b, high.b), narrow(low.c, high.c)};
+}
+
+template <std::derived_from<OnWords> Form> PYXCC_INLINE auto apply(const Form& form, const Three<wide::U8>& pixels)
 {
     const Two<wide::Sample> a = widen(pixels.a), b = widen(pixels.b), c = widen(pixels.c);
-    const auto low = form(a.a, b.a, c.a);
-    const auto high = form(a.b, b.b, c.b);
-    return {narrow(low.a, high.a), narrow(low.b, high.b), narrow(low.c, high.c)};
+    return narrowAll(form(a.a, b.a, c.a), form(a.b, b.b, c.b));
 }
 
 } // namespace pyxcc::frame

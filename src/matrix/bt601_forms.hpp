@@ -5,47 +5,26 @@
 // its results.
 #pragma once
 
-#include "frame/forms.hpp"
-#include "lanes/lanes.hpp"
+#include "matrix/forward_forms.hpp"
 
 namespace pyxcc::matrix
 {
 
-/// 32-bit sums. The chroma addends are 128 less 256 steps: keeping the low 8 bits takes the 256 away.
-struct FwdExact : frame::OnWords {
-    template <class Word> PYXCC_INLINE auto operator()(const Word& R, const Word& G, const Word& B) const
-    {
-        return Three{low8(exactSum<16, 0x108000, 16843, 33030, 6423>(R, G, B)),
-                     low8(exactSum<16, -0x7f8000, -9699, -19071, 28770>(R, G, B)),
-                     low8(exactSum<16, -0x7f8000, 28770, -24117, -4653>(R, G, B))};
-    }
-};
+inline constexpr Weights bt601Luma{16843, 33030, 6423};
+inline constexpr ChromaWeights bt601Chroma{{-9699, -19071, 28770}, {28770, -24117, -4653}};
+inline constexpr Weights bt601RoundedLuma{4211, 8258, 1606};
+inline constexpr ChromaWeights bt601RoundedChroma{{-2425, -4768, 7193}, {7193, -6029, -1163}};
 
-/// High halves of 16-bit products, each truncated by itself: luma in 256ths of a step, chroma in 128ths, to which 16.5
-/// and 128.5 steps are added.
-struct FwdHigh : frame::OnWords {
-    template <class Word> PYXCC_INLINE auto operator()(const Word& R, const Word& G, const Word& B) const
-    {
-        const auto y = mulHighU16(asU16(R << 8), 16843) + mulHighU16(asU16(G << 8), 33030) +
-                       mulHighU16(asU16(B << 8), 6423) + (16 * 256 + 128);
-        const auto r = R << 7, g = G << 7, b = B << 7;
-        const auto cb = mulHighS16(r, -9699) + mulHighS16(g, -19071) + mulHighS16(b, 28770) + (128 * 128 + 64);
-        const auto cr = mulHighS16(r, 28770) + mulHighS16(g, -24117) + mulHighS16(b, -4653) + (128 * 128 + 64);
-        return Three{sat8(asS16(y >> 8)), sat8(cb >> 7), sat8(cr >> 7)};
-    }
-};
+/// 16.5 and 128.5 steps are added.
+using LumaExact601 = LumaExact<bt601Luma, 0x108000>;
+using FwdExact = FullResolution<LumaExact601, ChromaExact<bt601Chroma, 1, 4>>;
 
-/// Rounded 16-bit products in sixty-fourths of a step: 16 steps for luma or 128 for chroma, and 2 / 64 for rounding.
-struct FwdRound : frame::OnWords {
-    template <class Word> PYXCC_INLINE auto operator()(const Word& R, const Word& G, const Word& B) const
-    {
-        const auto r = R << 7, g = G << 7, b = B << 7;
-        const auto y = mulRound15(r, 4211) + mulRound15(g, 8258) + mulRound15(b, 1606) + 1026;
-        const auto cr = mulRound15(r, 7193) - mulRound15(g, 6029) - mulRound15(b, 1163) + 8194;
-        const auto cb = mulRound15(b, 7193) - mulRound15(g, 4768) - mulRound15(r, 2425) + 8194;
-        return Three{sat8(y >> 6), sat8(cb >> 6), sat8(cr >> 6)};
-    }
-};
+/// Luma in 256ths of a step, chroma in 128ths: 16.5 and 128.5 steps are added.
+using FwdHigh = FullResolution<LumaHigh<bt601Luma, 16 * 256 + 128, 8>, ChromaHighSigned<bt601Chroma, 128, 16448, 7>>;
+
+/// 16 steps for luma or 128 for chroma are added, and 2 / 64 for rounding.
+using LumaRound601 = LumaRound<bt601RoundedLuma, 1026>;
+using FwdRound = FullResolution<LumaRound601, ChromaRound<bt601RoundedChroma, 128, 8194>>;
 
 /// The weights of an exact inverse form and what it adds: 16 steps of luma less, and a half more where it rounds.
 struct InvExactWeights {
