@@ -24,6 +24,8 @@ std::string_view nameOf(Element element);
 
 enum class Family {
     rgbYCbCr,
+    rgbToSubsampled,
+    bt709,
 };
 
 struct FamilyInfo {

@@ -5,6 +5,8 @@
 #ifndef PYXCC_PYXCC_H
 #define PYXCC_PYXCC_H
 
+#include "pyxcc/bt709.h"
+#include "pyxcc/rgb_to_subsampled.h"
 #include "pyxcc/rgb_ycbcr.h"
 #include "pyxcc/types.h"
 #include "pyxcc/version.h"

@@ -40,4 +40,10 @@ template <class... Test> PyxStatus firstFailure(const Test&... tests)
     return status;
 }
 
+/// What work that is done returns: a warning if the size is off blocks of width x height.
+inline PyxStatus warnIfOff(RoiSize roi, int width, int height)
+{
+    return roi.width % width == 0 && roi.height % height == 0 ? pyxOk : pyxWarnOddSize;
+}
+
 } // namespace pyxcc::frame

@@ -1,4 +1,5 @@
-// Shared chroma: what stands between 32 pixels and the 16 samples that pairs of them share.
+// Shared chroma: what stands between 32 pixels and the 16 samples that pairs of them share, or the 8 samples that fours
+// of them share.
 #pragma once
 
 #include "layouts/avx2/interleave.hpp"
@@ -33,6 +34,16 @@ PYXCC_INLINE HalfBlock narrowHalf(wide::Byte x)
 /// Each sum of two neighbours, in order.
 PYXCC_INLINE wide::S16 pairSums(wide::U8 x) { return wide::S16(_mm256_maddubs_epi16(x.v, _mm256_set1_epi8(1))); }
 
+/// Each sum of `Columns` neighbours, 2 or 4. Sums of fours stand in the even words, in order, and the odd words are
+/// zero.
+template <int Columns> PYXCC_INLINE wide::S16 sumsOf(wide::U8 x)
+{
+    static_assert(Columns == 2 || Columns == 4);
+    const wide::S16 pairs = pairSums(x);
+    if constexpr (Columns == 2) return pairs;
+    return wide::S16(_mm256_madd_epi16(pairs.v, _mm256_set1_epi16(1)));
+}
+
 /// Each word twice, in the order of widened bytes: what 16 chroma samples give is laid beside 32 luma samples.
 PYXCC_INLINE Two<wide::S16> doubled(wide::S16 x)
 {
@@ -52,6 +63,9 @@ namespace detail
 /// Even bytes, then odd ones, in each lane.
 constexpr Places evensThenOdds = {0, 2, 4, 6, 8, 10, 12, 14, 1, 3, 5, 7, 9, 11, 13, 15};
 
+/// The low half of a lane interleaved with the high one.
+constexpr Places halvesInTurn = {0, 8, 1, 9, 2, 10, 3, 11, 4, 12, 5, 13, 6, 14, 7, 15};
+
 /// 64-bit quarters 0 2 1 3: brings what both lanes hold of two things together.
 PYXCC_INLINE __m256i swapMiddle(__m256i x) { return _mm256_permute4x64_epi64(x, 0xd8); }
 
@@ -69,6 +83,35 @@ PYXCC_INLINE wide::U8 joinPairs(const ChromaPairs& x)
 {
     const __m128i low = _mm_unpacklo_epi8(x.a.v, x.b.v), high = _mm_unpackhi_epi8(x.a.v, x.b.v);
     return wide::U8(_mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1));
+}
+
+/// Writes the samples of two components that forms made of sums of `Columns` neighbours, 32 / Columns of each.
+template <int Columns> PYXCC_INLINE void storeApart(u8* a, u8* b, const Two<wide::Byte>& x)
+{
+    const __m256i lanes = _mm256_packus_epi16(x.a.v, x.b.v); // eight words of each, in each lane
+    if constexpr (Columns == 2) {
+        const __m256i apart = detail::swapMiddle(lanes);
+        storeHalf(a, {_mm256_castsi256_si128(apart)});
+        storeHalf(b, {_mm256_extracti128_si256(apart, 1)});
+    } else {
+        const __m256i evens = detail::shuffle(lanes, detail::evensThenOdds);
+        const __m128i apart =
+            _mm256_castsi256_si128(_mm256_permutevar8x32_epi32(evens, _mm256_setr_epi32(0, 4, 1, 5, 0, 4, 1, 5)));
+        _mm_storel_epi64(reinterpret_cast<__m128i*>(a), apart);
+        _mm_storeh_pd(reinterpret_cast<double*>(b), _mm_castsi128_pd(apart));
+    }
+}
+
+/// The samples of two components that forms made of sums of pairs, interleaved.
+PYXCC_INLINE wide::U8 narrowInTurn(const Two<wide::Byte>& x)
+{
+    return wide::U8(detail::shuffle(_mm256_packus_epi16(x.a.v, x.b.v), detail::halvesInTurn));
+}
+
+/// The even bytes of one block and the odd ones of another.
+PYXCC_INLINE wide::U8 inTurn(wide::U8 even, wide::U8 odd)
+{
+    return wide::U8(_mm256_blendv_epi8(even.v, odd.v, _mm256_set1_epi16(static_cast<short>(0xff00))));
 }
 
 /// The even and the odd bytes of 64: luma and chroma of packed 4:2:2.
