@@ -23,6 +23,7 @@ int sizeOf(Element element);
 std::string_view nameOf(Element element);
 
 enum class Family {
+    colorTwist,
     rgbYCbCr,
     rgbToSubsampled,
     bt709,
@@ -82,6 +83,12 @@ struct Parameter {
 };
 
 inline constexpr Parameter aval{"aval", 0, 255, 0, {255}};
+
+/// Matrices of colour twists, as rows. The standard one halves the saturation.
+inline constexpr Parameter twist3x4{
+    "twist", -2, 2, 12, {0.6495, 0.2935, 0.057, 0, 0.1495, 0.7935, 0.057, 0, 0.1495, 0.2935, 0.557, 0}};
+inline constexpr Parameter twist4x4{
+    "twist", -2, 2, 16, {0.6495, 0.2935, 0.057, 0, 0.1495, 0.7935, 0.057, 0, 0.1495, 0.2935, 0.557, 0, 0, 0, 0, 1}};
 
 /// What the signature tells of a parameter.
 struct ParameterType {

@@ -6,6 +6,7 @@
 #define PYXCC_PYXCC_H
 
 #include "pyxcc/bt709.h"
+#include "pyxcc/color_twist.h"
 #include "pyxcc/rgb_to_subsampled.h"
 #include "pyxcc/rgb_ycbcr.h"
 #include "pyxcc/types.h"

@@ -32,6 +32,11 @@ inline auto sizeAtLeast(RoiSize roi, int width, int height)
     return [=]() -> PyxStatus { return roi.width >= width && roi.height >= height ? pyxOk : pyxErrSize; };
 }
 
+template <class... Step> auto stepsAtLeast1(Step... steps)
+{
+    return [=]() -> PyxStatus { return ((steps >= 1) && ...) ? pyxOk : pyxErrStep; };
+}
+
 /// The result of the first test that fails, or pyxOk.
 template <class... Test> PyxStatus firstFailure(const Test&... tests)
 {

@@ -15,4 +15,13 @@ u32 saveRoundMode(u32 mode);
 /// Loads a control word that saveRoundMode() returned.
 void restoreRoundMode(u32 word);
 
+/// Does the work under rounding to nearest. The control word of before is loaded back only if its mode was another one:
+/// flags that the work raises under a caller who rounds to nearest stay raised.
+template <class Work> void roundingToNearest(const Work& work)
+{
+    const u32 word = saveRoundMode(roundNearest);
+    work();
+    if (word & roundingField) restoreRoundMode(word);
+}
+
 } // namespace pyxcc::frame

@@ -11,6 +11,8 @@
 #include <algorithm>
 #include <cmath>
 #include <concepts>
+#include <cstdint>
+#include <limits>
 
 namespace pyxcc::scalar
 {
@@ -36,6 +38,21 @@ using U8 = Lane<u8>;
 using S16 = Lane<s16>;
 using U16 = Lane<u16>;
 using S32 = Lane<s32>;
+
+template <std::floating_point T> struct Float {
+    T v;
+
+    constexpr Float() = default;
+    constexpr Float(T value) : v(value) {}
+
+    friend Float operator+(Float x, Float y) { return x.v + y.v; }
+    friend Float operator-(Float x, Float y) { return x.v - y.v; }
+    friend Float operator*(Float x, Float y) { return x.v * y.v; }
+    friend Float operator/(Float x, Float y) { return x.v / y.v; }
+};
+
+using F32 = Float<f32>;
+using F64 = Float<f64>;
 
 /// A sample that is ready to be stored as a byte.
 struct Byte {
@@ -64,7 +81,24 @@ template <int Shift, int Addend, int... Weights, class... Lanes> S16 exactSum(co
     return (Addend + ... + (Weights * lanes.v)) >> Shift;
 }
 
-inline f32 fused(f32 x, f32 y, f32 z) { return std::fma(x, y, z); }
-inline f64 fused(f64 x, f64 y, f64 z) { return std::fma(x, y, z); }
+inline F32 fused(F32 x, F32 y, F32 z) { return std::fma(x.v, y.v, z.v); }
+inline F64 fused(F64 x, F64 y, F64 z) { return std::fma(x.v, y.v, z.v); }
+
+/// A NaN on either side gives y.
+inline F32 lesser(F32 x, F32 y) { return x.v < y.v ? x : y; }
+inline F32 greater(F32 x, F32 y) { return x.v > y.v ? x : y; }
+
+inline F32 toF32(S32 x) { return static_cast<f32>(x.v); }
+
+/// Out of range and NaN give the lowest integer.
+inline S32 trunc(F32 x) { return x.v >= -0x1p31f && x.v < 0x1p31f ? static_cast<s32>(x.v) : INT32_MIN; }
+inline S32 nearest(F32 x) { return trunc(std::nearbyint(x.v)); }
+
+/// Clamps an integer at both ends of a sample's range.
+template <std::integral Sample> Sample saturate(S32 x)
+{
+    using Limits = std::numeric_limits<Sample>;
+    return static_cast<Sample>(std::clamp<s32>(x.v, Limits::min(), Limits::max()));
+}
 
 } // namespace pyxcc::scalar

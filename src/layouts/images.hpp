@@ -38,38 +38,38 @@ namespace detail
 template <class Sample> using RegisterOf = wide::RegisterOf<std::remove_const_t<Sample>>;
 template <class Sample> using ByteOf = std::conditional_t<std::is_const_v<Sample>, const u8, u8>;
 
-template <class Packing, class Sample> auto interleaved(Sample* first, int step, const Packing& packing)
+template <class Packing, class Sample> auto interleaved(Sample* first, std::ptrdiff_t step, const Packing& packing)
 {
     return InterleavedImage<Packing, ByteOf<Sample>>{bytes(first), step, packing};
 }
 
 } // namespace detail
 
-template <class Sample> auto c3(Sample* first, int step)
+template <class Sample> auto c3(Sample* first, std::ptrdiff_t step)
 {
     return detail::interleaved(first, step, C3<detail::RegisterOf<Sample>>{});
 }
 
 /// Four channels, of which the first three take part: a target keeps its fourth.
-template <class Sample> auto ac4(Sample* first, int step)
+template <class Sample> auto ac4(Sample* first, std::ptrdiff_t step)
 {
     return detail::interleaved(first, step, AC4<detail::RegisterOf<Sample>>{});
 }
 
 /// Four channels, all of which take part.
-template <class Sample> auto c4(Sample* first, int step)
+template <class Sample> auto c4(Sample* first, std::ptrdiff_t step)
 {
     return detail::interleaved(first, step, C4<detail::RegisterOf<Sample>>{});
 }
 
 /// A target whose fourth channel is set.
-template <class Sample> auto c4(Sample* first, int step, std::type_identity_t<Sample> fourth)
+template <class Sample> auto c4(Sample* first, std::ptrdiff_t step, std::type_identity_t<Sample> fourth)
 {
     return detail::interleaved(first, step, C4Set<detail::RegisterOf<Sample>>{fourth});
 }
 
 /// Three planes with one step.
-template <class Sample> auto p3(Sample* const planes[3], int step)
+template <class Sample> auto p3(Sample* const planes[3], std::ptrdiff_t step)
 {
     return PlanarImage<detail::RegisterOf<Sample>, detail::ByteOf<Sample>>{
         {bytes(planes[0]), bytes(planes[1]), bytes(planes[2])}, {step, step, step}};

@@ -49,4 +49,51 @@ PYXCC_INLINE S32 nearest(F32 x) { return S32(_mm256_cvtps_epi32(x.v)); }
 /// To an integer towards zero; out of range and NaN give the lowest integer.
 PYXCC_INLINE S32 trunc(F32 x) { return S32(_mm256_cvttps_epi32(x.v)); }
 
+namespace detail
+{
+
+/// Words and their upper halves, all zeros or all ones, as floats.
+PYXCC_INLINE Two<F32> floatsOfWords(__m256i words, __m256i upper)
+{
+    return {toF32(S32(_mm256_unpacklo_epi16(words, upper))), toF32(S32(_mm256_unpackhi_epi16(words, upper)))};
+}
+
+} // namespace detail
+
+/// Samples as floats, exactly, in the order that saturate() takes back: each 128-bit lane is widened by itself.
+PYXCC_INLINE Two<F32> toF32(U16 x) { return detail::floatsOfWords(x.v, _mm256_setzero_si256()); }
+PYXCC_INLINE Two<F32> toF32(S16 x)
+{
+    return detail::floatsOfWords(x.v, _mm256_cmpgt_epi16(_mm256_setzero_si256(), x.v));
+}
+PYXCC_INLINE Four<F32> toF32(U8 x)
+{
+    const __m256i zero = _mm256_setzero_si256();
+    const Two<F32> low = toF32(U16(_mm256_unpacklo_epi8(x.v, zero)));
+    const Two<F32> high = toF32(U16(_mm256_unpackhi_epi8(x.v, zero)));
+    return {low.a, low.b, high.a, high.b};
+}
+PYXCC_INLINE Four<F32> toF32(S8 x)
+{
+    const __m256i signs = _mm256_cmpgt_epi8(_mm256_setzero_si256(), x.v);
+    const Two<F32> low = toF32(S16(_mm256_unpacklo_epi8(x.v, signs)));
+    const Two<F32> high = toF32(S16(_mm256_unpackhi_epi8(x.v, signs)));
+    return {low.a, low.b, high.a, high.b};
+}
+
+/// Integers narrowed to samples, clamped at both ends.
+template <class Samples> Samples saturate(const Two<S32>& x);
+template <class Samples> Samples saturate(const Four<S32>& x);
+
+template <> PYXCC_INLINE U16 saturate(const Two<S32>& x) { return U16(_mm256_packus_epi32(x.a.v, x.b.v)); }
+template <> PYXCC_INLINE S16 saturate(const Two<S32>& x) { return S16(_mm256_packs_epi32(x.a.v, x.b.v)); }
+template <> PYXCC_INLINE U8 saturate(const Four<S32>& x)
+{
+    return U8(_mm256_packus_epi16(_mm256_packs_epi32(x.a.v, x.b.v), _mm256_packs_epi32(x.c.v, x.d.v)));
+}
+template <> PYXCC_INLINE S8 saturate(const Four<S32>& x)
+{
+    return S8(_mm256_packs_epi16(_mm256_packs_epi32(x.a.v, x.b.v), _mm256_packs_epi32(x.c.v, x.d.v)));
+}
+
 } // namespace pyxcc::wide
