@@ -15,7 +15,9 @@ using Samples = std::vector<u8>;
 inline Samples repeated(std::initializer_list<u8> pixel, int count)
 {
     Samples row;
-    for (int i = 0; i < count; ++i) row.insert(row.end(), pixel);
+    for (int i = 0; i < count; ++i) {
+        for (const u8 sample : pixel) row.push_back(sample);
+    }
     return row;
 }
 
