@@ -165,7 +165,7 @@ template <class Byte> void ComponentOf<Byte>::set(int x, int y, double value) co
     });
 }
 
-template class ComponentOf<const u8>;
+template double ComponentOf<const u8>::at(int x, int y) const;
 template class ComponentOf<u8>;
 
 Component component(Image& image, int index) { return view<u8>(image, index); }

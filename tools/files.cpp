@@ -36,7 +36,7 @@ void writeNew(const fs::path& path, const fs::path& shown, std::span<const u8> b
 {
     Handle file(std::fopen(path.c_str(), "wbx"));
     if (!file) failFor("write", shown, errno);
-    const bool written = std::fwrite(bytes.data(), 1, bytes.size(), file.get()) == bytes.size();
+    const bool written = bytes.empty() || std::fwrite(bytes.data(), bytes.size(), 1, file.get()) == 1;
     if (written && std::fclose(file.release()) == 0) return;
     const int error = errno;
     std::error_code ignored;
