@@ -15,12 +15,12 @@ namespace
 constexpr std::string_view style = R"(
 :root {
   color-scheme: light dark;
-  --page: #f6f6f4; --card: #ffffff; --ink: #1b1c1e; --soft: #5b6067; --line: #dcdcd8; --link: #0b57a4;
+  --page: #f6f6f4; --card: #ffffff; --well: #e9e9e6; --ink: #1b1c1e; --soft: #5b6067; --line: #dcdcd8; --link: #0b57a4;
   --good: #12693a; --warn: #8a5a00; --bad: #a81e1e;
 }
 @media (prefers-color-scheme: dark) {
   :root {
-    --page: #16181b; --card: #1f2226; --ink: #e9eaec; --soft: #a3a9b1; --line: #34383e; --link: #8ab8f0;
+    --page: #16181b; --card: #1f2226; --well: #16181b; --ink: #e9eaec; --soft: #a3a9b1; --line: #34383e; --link: #8ab8f0;
     --good: #6fd39a; --warn: #e8b95a; --bad: #f28b82;
   }
 }
@@ -54,7 +54,7 @@ article {
   overflow: hidden; content-visibility: auto; contain-intrinsic-size: auto 430px;
 }
 article img { display: block; width: 100%; height: auto; }
-.parts { padding: 10px 12px 4px; background: var(--page); }
+.parts { padding: 10px 12px 4px; background: var(--well); }
 .names { display: flex; color: var(--soft); font-size: 0.78rem; }
 .names span { flex: 1; text-align: center; }
 .text { display: flex; flex-direction: column; gap: 3px; padding: 10px 12px 12px; }
