@@ -158,7 +158,8 @@ void writeCard(std::ostream& out, const Card& card, RoiSize whole)
 void writeIndex(std::ostream& out, const Sheet& sheet)
 {
     out << "<nav aria-label=\"Families\" id=\"index\">\n"
-        << "<input type=\"search\" placeholder=\"A part of a name, or a family\" aria-label=\"A part of a name, or a family\" hidden>\n<ul>\n";
+        << "<input type=\"search\" placeholder=\"A part of a name, or a family\" aria-label=\"A part of a name, or a "
+           "family\" hidden>\n<ul>\n";
     for (const Section& section : sheet.sections) {
         out << "<li><a href=\"#" << section.family->slug << "\">" << escaped(section.family->title) << "</a> <span>"
             << section.cards.size() << "</span></li>\n";
