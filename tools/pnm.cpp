@@ -72,12 +72,13 @@ private:
 template <class Read> void fill(Image& image, const u8* from, int sampleBytes, bool bottomUp, Read read)
 {
     const int channels = image.side().samples;
+    const int pixelBytes = channels * sampleBytes;
     for (int channel = 0; channel < channels; ++channel) {
         const Component target = component(image, channel);
         for (int y = 0; y < target.size.height; ++y) {
             const int row = bottomUp ? target.size.height - 1 - y : y;
             const u8* at = from + (static_cast<std::size_t>(y) * target.size.width * channels + channel) * sampleBytes;
-            for (int x = 0; x < target.size.width; ++x, at += channels * sampleBytes) target.set(x, row, read(at));
+            for (int x = 0; x < target.size.width; ++x, at += pixelBytes) target.set(x, row, read(at));
         }
     }
 }
