@@ -91,9 +91,9 @@ int parseAndRun(int argc, char** argv)
     running->add_option("--size", size, "WxH: IN holds the planes of the export's source, one after another");
     running->add_option("--set", assignments, "name=value: a parameter of the export")->allow_extra_args(false);
     running->callback([&] {
-        RunOptions options{name, input, output, std::nullopt, assignments};
+        RunOptions options{input, output, std::nullopt, assignments};
         if (!size.empty()) options.rawSize = readSize(size);
-        run(options, std::cout);
+        run(named(name), options, std::cout);
     });
 
     CLI::App* const touring = app.add_subcommand("tour", "Make a page that shows what every export does to a picture");

@@ -18,7 +18,7 @@ using catalog::Element;
 /// siblings with them.
 bool converts(const catalog::Export& entry)
 {
-    return !entry.inPlace && !entry.stepless && !entry.source.model.empty() && !entry.target.model.empty();
+    return !entry.stepless && !entry.source.model.empty() && !entry.target.model.empty();
 }
 
 bool isSubsampled(const catalog::Side& side) { return side.chromaX + side.chromaY > 0; }

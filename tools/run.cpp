@@ -3,7 +3,6 @@
 #include "convert.hpp"
 #include "failure.hpp"
 #include "image_file.hpp"
-#include "lookup.hpp"
 #include "preview.hpp"
 #include "sheet.hpp"
 #include "status.hpp"
@@ -35,9 +34,8 @@ Image pictureOf(const Graph& graph, const Image& image, std::string& way)
 
 } // namespace
 
-void run(const RunOptions& options, std::ostream& out)
+void run(const catalog::Export& entry, const RunOptions& options, std::ostream& out)
 {
-    const catalog::Export& entry = named(options.name);
     Parameters parameters(entry);
     for (const std::string& assignment : options.assignments) parameters.set(assignment);
 

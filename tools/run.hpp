@@ -1,6 +1,7 @@
 // One export on one picture.
 #pragma once
 
+#include "catalog.hpp"
 #include "files.hpp"
 
 #include <iosfwd>
@@ -12,13 +13,12 @@ namespace tool
 {
 
 struct RunOptions {
-    std::string name;
     fs::path input, output;
     std::optional<RoiSize> rawSize;       ///< the input is raw planes of that size, in the export's source format
     std::vector<std::string> assignments; ///< "name=value"
 };
 
 /// Converts, writes and tells about it. An error status of the export is a Failure, and nothing is written.
-void run(const RunOptions& options, std::ostream& out);
+void run(const catalog::Export& entry, const RunOptions& options, std::ostream& out);
 
 } // namespace tool

@@ -28,6 +28,28 @@ using Samples = std::vector<double>;
 
 const Image twoPixels = imageOf(rgb(), {2, 1}, {10, 20, 30, 40, 50, 60});
 
+TEST(Image, HasRoomForWholeChromaBlocks)
+{
+    const Image image(format("YCbCr420", "P3"), {5, 5});
+    EXPECT_GE(image.step(0), 8);
+    EXPECT_GE(image.plane(1) - image.plane(0), 8 * image.step(0));
+    EXPECT_GE(image.plane(2) - image.plane(1), 4 * image.step(1));
+    EXPECT_EQ(image.tightBytes(), 5u * 5 + 2 * 2 * 2);
+}
+
+TEST(Image, HasRowsEndToEndForExportsWithoutSteps)
+{
+    const Image image(format("YCbCr420", "P3"), {5, 5}, Image::Rows::tight);
+    EXPECT_EQ(image.step(0), 5);
+    EXPECT_EQ(image.step(1), 2);
+}
+
+TEST(Image, IsCroppedToItsUpperLeft)
+{
+    const Image picture = imageOf(gray(), {3, 2}, {1, 2, 3, 4, 5, 6});
+    EXPECT_EQ(rawBytes(cropped(picture, {2, 2})), (Bytes{1, 2, 4, 5}));
+}
+
 TEST(Repack, ReversesTheOrderOfChannels)
 {
     EXPECT_EQ(row<u8>(repack(twoPixels, format("BGR", "C3")), 0, 6), (Samples{30, 20, 10, 60, 50, 40}));

@@ -2,6 +2,8 @@
 #include "preview.hpp"
 #include "support.hpp"
 
+#include <algorithm>
+
 using namespace tool;
 using namespace tool::testing;
 using catalog::Element;
@@ -53,11 +55,13 @@ TEST(Route, DoesNotGoAgainstAnExport)
 
 TEST(Route, TakesTheShorterOfTwoWays)
 {
-    const End middle = {"XYZ", "C3"};
-    EXPECT_EQ(way({conversion("a", {"RGB", "C3"}, middle), conversion("b", middle, yccC3),
-                   conversion("c", {"RGB", "C3"}, yccC3)},
-                  rgb(), format(yccC3)),
-              "c");
+    const End a = {"XYZ", "C3"}, b = {"HSV", "C3"}, c = {"HLS", "C3"};
+    std::vector<catalog::Export> exports = {conversion("toA", {"RGB", "C3"}, a), conversion("toB", {"RGB", "C3"}, b),
+                                            conversion("aToC", a, c), conversion("cToEnd", c, yccC3),
+                                            conversion("bToEnd", b, yccC3)};
+    EXPECT_EQ(way(exports, rgb(), format(yccC3)), "toB, bToEnd");
+    std::ranges::reverse(exports);
+    EXPECT_EQ(way(exports, rgb(), format(yccC3)), "toB, bToEnd");
 }
 
 TEST(Route, RepacksBeforeAndBehind)
@@ -118,12 +122,12 @@ TEST(Route, GoesBackByTheSameEncoding)
     EXPECT_EQ(way(exports, format(video, "709CSC"), rgb()), "repacked as YCbCr420 P3 u8, back");
 }
 
-TEST(Route, InPlaceOperationsLeadNowhere)
+TEST(Route, OperationsWithoutAModelWorkOnRgbAndAreNoWay)
 {
-    catalog::Export twist = conversion("twist", {"", "C3"}, {"", "C3"});
-    twist.inPlace = true;
-    EXPECT_EQ(nameOf(sourceOf(twist)), "RGB C3 u8");
-    EXPECT_EQ(way({twist}, rgb(), format(yccC3)), "no way");
+    const catalog::Export operation = conversion("operation", {"", "AC4", Element::s8}, {"", "C1", Element::bit});
+    EXPECT_EQ(nameOf(sourceOf(operation)), "RGB AC4 s8");
+    EXPECT_EQ(nameOf(targetOf(operation)), "Gray C1 bit");
+    EXPECT_EQ(way({operation}, rgb(), targetOf(operation)), "no way");
 }
 
 TEST(Route, ReachesEveryExportOfTheFirstFamilyAndBack)
@@ -152,6 +156,17 @@ TEST(Follow, BringsWhiteToTheTopOfTheStudioRange)
     EXPECT_EQ(result.plane(0)[1], 235);
     EXPECT_EQ(result.plane(1)[1], 128);
     EXPECT_EQ(result.plane(2)[1], 128);
+}
+
+TEST(Follow, StopsAtAnErrorButNotAtAWarning)
+{
+    catalog::Export entry = conversion("export", {"RGB", "C3"}, yccC3);
+    const Route route = {{&entry, targetOf(entry)}};
+    const Image image(rgb(), {3, 3});
+    entry.invoke = [](catalog::Function, const catalog::Invocation&) -> PyxStatus { return pyxWarnOddSize; };
+    EXPECT_EQ(nameOf(follow(route, image).format()), "YCC C3 u8");
+    entry.invoke = [](catalog::Function, const catalog::Invocation&) -> PyxStatus { return pyxErrSize; };
+    EXPECT_NE(failureOf([&] { follow(route, image); }).find("export returns pyxErrSize (-6)"), std::string::npos);
 }
 
 TEST(Measure, TellsStatusAndTraffic)
