@@ -21,7 +21,7 @@ Image convert(const catalog::Export& entry, const Image& image)
 {
     Image source = asSource(entry, image), target = makeTarget(entry, image.size());
     const PyxStatus status = call(entry, source, target, Parameters(entry));
-    if (status < 0) fail("on the way there, ", entry.name, " returns ", statusText(status));
+    if (status < 0) fail("on the way, ", entry.name, " returns ", statusText(status));
     return target;
 }
 

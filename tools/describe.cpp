@@ -185,6 +185,11 @@ std::string statusWords(const catalog::Export& entry)
     if (widthMultiple > 1) off.push_back(offBlock("width", widthMultiple));
     if (heightMultiple > 1) off.push_back(offBlock("height", heightMultiple));
     if (!off.empty()) text += ", " + statusText(pyxWarnOddSize) + " for " + joined(off, " or ");
+    if (entry.traits.stepsTested) text += ", " + statusText(pyxErrStep) + " for a step below 1";
+    for (const catalog::Parameter& parameter : entry.traits.parameters) {
+        if (parameter.status == pyxOk) continue;
+        text += ", " + statusText(parameter.status) + " for " + std::string(parameter.name);
+    }
     return text;
 }
 

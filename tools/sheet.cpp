@@ -20,8 +20,8 @@ constexpr std::string_view style = R"(
 }
 @media (prefers-color-scheme: dark) {
   :root {
-    --page: #16181b; --card: #1f2226; --well: #16181b; --ink: #e9eaec; --soft: #a3a9b1; --line: #34383e; --link: #8ab8f0;
-    --good: #6fd39a; --warn: #e8b95a; --bad: #f28b82;
+    --page: #16181b; --card: #1f2226; --well: #16181b; --ink: #e9eaec; --soft: #a3a9b1; --line: #34383e;
+    --link: #8ab8f0; --good: #6fd39a; --warn: #e8b95a; --bad: #f28b82;
   }
 }
 * { box-sizing: border-box; }
@@ -80,6 +80,10 @@ find.addEventListener("input", () => {
   }
 });
 )";
+
+constexpr std::string_view legend =
+    "Each card shows the target brought back to RGB, then its components in gray. Times are the best of several calls; "
+    "rates count the bytes read and written.";
 
 std::string escaped(std::string_view text)
 {
@@ -155,6 +159,24 @@ void writeCard(std::ostream& out, const Card& card, RoiSize whole)
     out << "</div>\n</article>\n";
 }
 
+void writeHead(std::ostream& out, const Sheet& sheet)
+{
+    out << "<head>\n<meta charset=\"utf-8\">\n"
+        << "<meta name=\"viewport\" content=\"width=device-width, initial-scale=1\">\n"
+        << "<title>pyxcc: " << escaped(sheet.title) << "</title>\n<style>" << style << "</style>\n</head>\n";
+}
+
+void writeTitle(std::ostream& out, const Sheet& sheet)
+{
+    std::size_t count = 0;
+    for (const Section& section : sheet.sections) count += section.cards.size();
+    out << "<header>\n"
+        << image(sheet.picture, "The source picture") << "\n<div>\n<h1>pyxcc tour</h1>\n<p>" << count
+        << (count == 1 ? " conversion of " : " conversions of ") << escaped(sheet.title) << ", " << sheet.size.width
+        << " × " << sheet.size.height << "</p>\n<p>Library " << escaped(pyxccGetLibVersion()->versionText)
+        << "</p>\n</div>\n</header>\n";
+}
+
 void writeIndex(std::ostream& out, const Sheet& sheet)
 {
     out << "<nav aria-label=\"Families\" id=\"index\">\n"
@@ -198,23 +220,15 @@ std::string rateText(double bytes, double seconds)
 
 std::string html(const Sheet& sheet)
 {
-    std::size_t count = 0;
-    for (const Section& section : sheet.sections) count += section.cards.size();
     std::ostringstream out;
-    out << "<!doctype html>\n<html lang=\"en\">\n<head>\n<meta charset=\"utf-8\">\n"
-        << "<meta name=\"viewport\" content=\"width=device-width, initial-scale=1\">\n<title>pyxcc: "
-        << escaped(sheet.title) << "</title>\n<style>" << style << "</style>\n</head>\n<body>\n<header>\n"
-        << image(sheet.picture, "The source picture") << "\n<div>\n<h1>pyxcc tour</h1>\n<p>" << count
-        << (count == 1 ? " conversion of " : " conversions of ") << escaped(sheet.title) << ", " << sheet.size.width
-        << " × " << sheet.size.height << "</p>\n<p>Library " << escaped(pyxccGetLibVersion()->versionText)
-        << "</p>\n</div>\n</header>\n";
+    out << "<!doctype html>\n<html lang=\"en\">\n";
+    writeHead(out, sheet);
+    out << "<body>\n";
+    writeTitle(out, sheet);
     writeIndex(out, sheet);
     out << "<main>\n";
     for (const Section& section : sheet.sections) writeSection(out, section, sheet.size);
-    out << "</main>\n<footer>Each card shows the target brought back to RGB, then its components in gray. Times are "
-           "the "
-           "best of several calls; rates count the bytes read and written.</footer>\n<script>"
-        << script << "</script>\n</body>\n</html>\n";
+    out << "</main>\n<footer>" << legend << "</footer>\n<script>" << script << "</script>\n</body>\n</html>\n";
     return out.str();
 }
 

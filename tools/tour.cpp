@@ -7,6 +7,7 @@
 #include "sheet.hpp"
 
 #include <algorithm>
+#include <optional>
 #include <ostream>
 
 namespace tool
@@ -23,6 +24,17 @@ RoiSize wholeBlocks(const catalog::Minimum& minimum, RoiSize size)
 {
     return {size.width / minimum.widthMultiple * minimum.widthMultiple,
             size.height / minimum.heightMultiple * minimum.heightMultiple};
+}
+
+/// The image at the end of the route; if an export fails on it, `why` tells so.
+std::optional<Image> tryFollow(const Route& route, Image image, std::string& why)
+{
+    try {
+        return follow(route, std::move(image));
+    } catch (const Failure& failure) {
+        why = failure.what();
+        return std::nullopt;
+    }
 }
 
 class Tour
@@ -49,26 +61,23 @@ public:
             card.note = "No conversion makes its source yet.";
             return card;
         }
-        try {
-            checkSize(card.size.width, card.size.height, "the part of the picture that it takes");
-            call(card, *way);
-        } catch (const Failure& failure) {
-            card.note = failure.what();
+        if (card.size.width < 1 || card.size.height < 1) {
+            card.note = "The picture is too small.";
+            return card;
         }
+        card.madeBy = describe(*way);
+        if (const auto source = tryFollow(*way, cropped(picture_, card.size), card.note)) call(card, *source);
         return card;
     }
 
 private:
-    void call(Card& card, const Route& way) const
+    void call(Card& card, const Image& source) const
     {
-        const catalog::Export& entry = *card.entry;
-        const Image source = follow(way, cropped(picture_, card.size));
-        const Measured done = measure(entry, source, Parameters(entry), secondsForEach);
+        const Measured done = measure(*card.entry, source, Parameters(*card.entry), secondsForEach);
         card.called = true;
         card.status = done.status;
         card.seconds = done.seconds;
         card.bytes = done.bytes;
-        card.madeBy = describe(way);
         if (done.status < 0) {
             card.note = "Nothing was written.";
         } else {
@@ -79,14 +88,15 @@ private:
     void showTarget(Card& card, const Image& target) const
     {
         const std::string name(card.entry->name);
-        for (std::string_view component : componentsOf(target.side())) card.components.push_back(component);
+        card.components = componentsOf(target.side());
         const int tiles = std::max(static_cast<int>(card.components.size()), 3);
         const RoiSize tile = fitted(card.size, {pictureBox.width / tiles, pictureBox.height / tiles});
         card.tiles = show(name + ".parts.png", componentTiles(target, tile));
         const auto back = wayToPicture(graph_, target.format());
         if (!back) return;
-        card.picture = show(name + ".png", eightBit(scaledDown(follow(*back, target), pictureBox)));
         card.shownBy = describe(*back);
+        const auto picture = tryFollow(*back, target, card.shownBy);
+        if (picture) card.picture = show(name + ".png", eightBit(scaledDown(*picture, pictureBox)));
     }
 
     const Image& picture_;

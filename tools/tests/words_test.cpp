@@ -124,4 +124,16 @@ TEST(Describe, TellsTestsInTheirOrder)
     EXPECT_NE(sheetOf(withAlpha()).find("pyxErrSize (-6)"), std::string::npos);
 }
 
+TEST(Describe, NamesTheStatusesOfStepsAndParameters)
+{
+    catalog::Export entry = named("pyxiRGBToYCbCr_8u_C3R");
+    EXPECT_EQ(sheetOf(entry).find("pyxErrStep"), std::string::npos);
+    entry.traits.stepsTested = true;
+    entry.traits.parameters[0].name = "levels";
+    entry.traits.parameters[0].status = pyxErrLevels;
+    EXPECT_NE(sheetOf(entry).find("pyxErrStep (-14) for a step below 1, pyxErrLevels (-54) for levels"),
+              std::string::npos);
+    EXPECT_NE(sheetOf(entry).find("tests       null pointers, size, steps, parameters\n"), std::string::npos);
+}
+
 } // namespace
