@@ -123,6 +123,17 @@ std::string arrowed(const std::string& conversion)
     return arrow == std::string::npos ? conversion : conversion.substr(0, arrow) + "→" + conversion.substr(arrow + 2);
 }
 
+/// A name that may break behind its underscores.
+std::string breakable(std::string_view name)
+{
+    std::string result;
+    for (const char c : name) {
+        result += c;
+        if (c == '_') result += "<wbr>";
+    }
+    return result;
+}
+
 std::string_view toneOf(PyxStatus status) { return status < 0 ? "bad" : status > 0 ? "warn" : "good"; }
 
 /// `whole` is the size of the picture, of which a conversion may have taken a part.
@@ -140,8 +151,8 @@ void writeCard(std::ostream& out, const Card& card, RoiSize whole)
         for (std::string_view component : card.components) out << "<span>" << escaped(component) << "</span>";
         out << "</div></div>\n";
     }
-    out << "<div class=\"text\">\n<h3>" << name << "</h3>\n<p>" << escaped(arrowed(conversionOf(*card.entry)))
-        << "</p>\n";
+    out << "<div class=\"text\">\n<h3>" << breakable(name) << "</h3>\n<p>"
+        << escaped(arrowed(conversionOf(*card.entry))) << "</p>\n";
     if (card.called) {
         out << "<p class=\"facts\"><span class=\"" << toneOf(card.status) << "\">" << statusText(card.status)
             << "</span>";

@@ -93,7 +93,10 @@ private:
         const RoiSize tile = fitted(card.size, {pictureBox.width / tiles, pictureBox.height / tiles});
         card.tiles = show(name + ".parts.png", componentTiles(target, tile));
         const auto back = wayToPicture(graph_, target.format());
-        if (!back) return;
+        if (!back) {
+            card.shownBy = "its components alone, since no conversion leads back yet";
+            return;
+        }
         card.shownBy = describe(*back);
         const auto picture = tryFollow(*back, target, card.shownBy);
         if (picture) card.picture = show(name + ".png", eightBit(scaledDown(*picture, pictureBox)));
