@@ -80,7 +80,7 @@ Export describe(std::string_view name, PyxStatus(PYXCC_CALL* function)(A...), Fa
     entry.stepless = naming.stepless;
     entry.source.chromaUp = traits.sourceChromaUp;
     entry.target.chromaUp = traits.targetChromaUp;
-    entry.source.bytesInFront = traits.sourceBytesInFront;
+    entry.source.byteInFront = traits.sourceByteInFront;
     readSignature<A...>(entry);
     entry.function = reinterpret_cast<Function>(function);
     entry.invoke = naming.inPlace ? &detail::invoke<true, A...> : &detail::invoke<false, A...>;

@@ -26,6 +26,7 @@ enum class Family {
     colorTwist,
     rgbYCbCr,
     rgbToSubsampled,
+    subsampledToRgb,
     bt709,
 };
 
@@ -113,7 +114,7 @@ struct Traits {
     bool stepsTested = false;                 ///< a step below 1 yields pyxErrStep
     bool sourceChromaUp = false;              ///< the source has a chroma sample for a part of a block, too
     bool targetChromaUp = false;              ///< and so has the target
-    int sourceBytesInFront = 0;               ///< that are read in front of a row of the source
+    bool sourceByteInFront = false;           ///< in front of a row of the source, if that is one pixel wide, is read
     Range range = {};                         ///< of the source's samples
     double tolerance = 0;                     ///< by which a target sample may be off, where its last bit is left open
     bool followsRounding = false;             ///< an integer result depends on the caller's rounding mode
@@ -139,7 +140,7 @@ struct Side {
     Steps steps = Steps::one;     ///< how the signature gives the steps
     int chromaX = 0, chromaY = 0; ///< chroma is shared by 1 << chromaX columns and 1 << chromaY rows
     bool chromaUp = false;        ///< a part of such a block has a sample of its own
-    int bytesInFront = 0;         ///< that are read in front of a row
+    bool byteInFront = false;     ///< in front of a row, if that is one pixel wide, is read
     bool spareFourth = false;     ///< AC4: the fourth sample is not read, or keeps its value
 };
 

@@ -145,6 +145,91 @@ PYXCC_API PyxStatus PYXCC_CALL pyxiBGRToCbYCr422_709HDTV_8u_C3C2R(const u8* src,
 PYXCC_API PyxStatus PYXCC_CALL pyxiBGRToCbYCr422_709HDTV_8u_AC4C2R(const u8* src, int srcStep, u8* dst, int dstStep,
                                                                    RoiSize roi);
 
+/**
+ * Planar studio-range YCbCr to interleaved BGR. `inv709High` (4) up to `W`, which is `width & ~15`, `inv709Exact` from
+ * there on.
+ *
+ * @param src planes Y, Cb, Cr, one step for all
+ * @param srcStep bytes from one source row to the next
+ * @param dst B, G, R triples, 3 bytes a pixel
+ * @param dstStep bytes from one target row to the next
+ * @param roi width and height in pixels, each at least 1
+ * @return ::pyxOk, ::pyxErrNullPtr or ::pyxErrSize
+ */
+PYXCC_API PyxStatus PYXCC_CALL pyxiYCbCrToBGR_709CSC_8u_P3C3R(const u8* const src[3], int srcStep, u8* dst, int dstStep,
+                                                              RoiSize roi);
+
+/**
+ * Planar studio-range YCbCr to interleaved BGR with a fourth byte. As ::pyxiYCbCrToBGR_709CSC_8u_P3C3R.
+ *
+ * @param src planes Y, Cb, Cr, one step for all
+ * @param srcStep bytes from one source row to the next
+ * @param dst B, G, R, A, 4 bytes a pixel
+ * @param dstStep bytes from one target row to the next
+ * @param roi width and height in pixels, each at least 1
+ * @param aval value of the fourth byte of every pixel that is written
+ * @return ::pyxOk, ::pyxErrNullPtr or ::pyxErrSize
+ */
+PYXCC_API PyxStatus PYXCC_CALL pyxiYCbCrToBGR_709CSC_8u_P3C4R(const u8* const src[3], int srcStep, u8* dst, int dstStep,
+                                                              RoiSize roi, u8 aval);
+
+/**
+ * Planar studio-range YCbCr 4:2:0 to interleaved BGR. `inv709High` (0) up to `W`, which is `width & ~15`,
+ * `inv709Exact` from there on. The elements of `src` are tested after the size.
+ *
+ * @param src planes Y, Cb, Cr; those of Cb and Cr have half the width and height
+ * @param srcStep for each plane, bytes from one row to the next
+ * @param dst B, G, R triples, 3 bytes a pixel
+ * @param dstStep bytes from one target row to the next
+ * @param roi width and height in pixels, each at least 1
+ * @return ::pyxOk, ::pyxWarnOddSize for an odd width or height, ::pyxErrNullPtr or ::pyxErrSize
+ */
+PYXCC_API PyxStatus PYXCC_CALL pyxiYCbCr420ToBGR_709CSC_8u_P3C3R(const u8* const src[3], const int srcStep[3], u8* dst,
+                                                                 int dstStep, RoiSize roi);
+
+/**
+ * Planar full-range YCbCr 4:2:0 to interleaved BGR with a fourth byte. `invHdtvHigh` up to `W`, which is `width &
+ * ~15`, `invHdtvExact` from there on. The elements of `src` are tested after the size.
+ *
+ * @param src planes Y, Cb, Cr; those of Cb and Cr have half the width and height
+ * @param srcStep for each plane, bytes from one row to the next
+ * @param dst B, G, R, A, 4 bytes a pixel
+ * @param dstStep bytes from one target row to the next
+ * @param roi width and height in pixels, each at least 1
+ * @param aval value of the fourth byte of every pixel that is written
+ * @return ::pyxOk, ::pyxWarnOddSize for an odd width or height, ::pyxErrNullPtr or ::pyxErrSize
+ */
+PYXCC_API PyxStatus PYXCC_CALL pyxiYCbCr420ToBGR_709HDTV_8u_P3C4R(const u8* const src[3], const int srcStep[3], u8* dst,
+                                                                  int dstStep, RoiSize roi, u8 aval);
+
+/**
+ * Packed full-range CbYCr 4:2:2 to interleaved BGR. `invHdtvHigh` up to `W`, which is `width & ~7`, `invHdtvExact`
+ * from there on. An odd last pixel takes the Cr of the pair before; in a row of one pixel its Cb serves as Cr.
+ *
+ * @param src packed Cb Y0 Cr Y1, 2 bytes a pixel
+ * @param srcStep bytes from one source row to the next
+ * @param dst B, G, R triples, 3 bytes a pixel
+ * @param dstStep bytes from one target row to the next
+ * @param roi width and height in pixels, each at least 1
+ * @return ::pyxOk, ::pyxErrNullPtr or ::pyxErrSize
+ */
+PYXCC_API PyxStatus PYXCC_CALL pyxiCbYCr422ToBGR_709HDTV_8u_C2C3R(const u8* src, int srcStep, u8* dst, int dstStep,
+                                                                  RoiSize roi);
+
+/**
+ * Packed full-range CbYCr 4:2:2 to interleaved BGR with a fourth byte. As ::pyxiCbYCr422ToBGR_709HDTV_8u_C2C3R.
+ *
+ * @param src packed Cb Y0 Cr Y1, 2 bytes a pixel
+ * @param srcStep bytes from one source row to the next
+ * @param dst B, G, R, A, 4 bytes a pixel
+ * @param dstStep bytes from one target row to the next
+ * @param roi width and height in pixels, each at least 1
+ * @param aval value of the fourth byte of every pixel that is written
+ * @return ::pyxOk, ::pyxErrNullPtr or ::pyxErrSize
+ */
+PYXCC_API PyxStatus PYXCC_CALL pyxiCbYCr422ToBGR_709HDTV_8u_C2C4R(const u8* src, int srcStep, u8* dst, int dstStep,
+                                                                  RoiSize roi, u8 aval);
+
 #ifdef __cplusplus
 }
 #endif

@@ -9,6 +9,7 @@
 #include "pyxcc/color_twist.h"
 #include "pyxcc/rgb_to_subsampled.h"
 #include "pyxcc/rgb_ycbcr.h"
+#include "pyxcc/subsampled_to_rgb.h"
 #include "pyxcc/types.h"
 #include "pyxcc/version.h"
 

@@ -71,6 +71,12 @@ inline S16 mulRound15(S16 x, int k) { return (x.v * k + 16384) >> 15; }
 inline S16 mulHighS16(S16 x, int k) { return (x.v * k) >> 16; }
 inline U16 mulHighU16(U16 x, int k) { return static_cast<int>((static_cast<u32>(x.v) * static_cast<u32>(k)) >> 16); }
 
+/// mulHighS16(128 (x - Zero), Weight): what a sample adds in the high-product forms.
+template <int Zero, int Weight> S16 highShare(S16 x) { return mulHighS16((x - Zero) << 7, Weight); }
+
+/// (x + half) >> Shift, half being half a step of the result.
+template <int Shift> S16 roundedShift(S16 x) { return (x.v + (1 << (Shift - 1))) >> Shift; }
+
 inline S16 addSatS16(S16 x, S16 y) { return std::clamp(x.v + y.v, -32768, 32767); }
 inline S16 subSatS16(S16 x, S16 y) { return std::clamp(x.v - y.v, -32768, 32767); }
 inline U16 addSatU16(U16 x, U16 y) { return std::min(x.v + y.v, 65535); }

@@ -83,6 +83,9 @@ template <class Packing, class Byte> struct InterleavedRow {
     {
         alignas(32) u8 buffer[block * pixelBytes] = {};
         copyBytes(buffer, pixel(x), count * pixelBytes);
+        if constexpr (requires { Packing::completeLastPair(buffer, at, x); }) {
+            if (count % 2 != 0) Packing::completeLastPair(buffer + count * pixelBytes, at, x + count);
+        }
         return packing.load(buffer);
     }
 

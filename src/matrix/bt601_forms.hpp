@@ -6,6 +6,7 @@
 #pragma once
 
 #include "matrix/forward_forms.hpp"
+#include "matrix/inverse_forms.hpp"
 
 namespace pyxcc::matrix
 {
@@ -26,63 +27,31 @@ using FwdHigh = FullResolution<LumaHigh<bt601Luma, 16 * 256 + 128, 8>, ChromaHig
 using LumaRound601 = LumaRound<bt601RoundedLuma, 1026>;
 using FwdRound = FullResolution<LumaRound601, ChromaRound<bt601RoundedChroma, 128, 8194>>;
 
-/// The weights of an exact inverse form and what it adds: 16 steps of luma less, and a half more where it rounds.
-struct InvExactWeights {
-    int y, crToR, cbToG, crToG, cbToB, addend;
-};
+inline constexpr InverseWeights bt601Inverse{76284, 104595, -25690, -53281, 132186};
+inline constexpr InverseWeights bt601InverseLess{76282, 104593, -25689, -53279, 132184};
+inline constexpr InverseWeights bt601InverseMore{76294, 104595, -25625, -53281, 132186};
 
-template <InvExactWeights k> struct InvExact : frame::OnWords {
-    template <class Word> PYXCC_INLINE auto operator()(const Word& Y, const Word& Cb, const Word& Cr) const
-    {
-        const auto cb = Cb - 128, cr = Cr - 128;
-        return Three{sat8(exactSum<16, k.addend, k.y, k.crToR>(Y, cr)),
-                     sat8(exactSum<16, k.addend, k.y, k.cbToG, k.crToG>(Y, cb, cr)),
-                     sat8(exactSum<16, k.addend, k.y, k.cbToB>(Y, cb))};
-    }
-};
+/// 16 steps of luma are taken off, in those that round half a step less.
+using InvExactA = InvExact<bt601Inverse, from128(bt601Inverse, -1220544)>;         // truncates
+using InvExactB = InvExact<bt601Inverse, from128(bt601Inverse, -1187776)>;         // rounds
+using InvExactC = InvExact<bt601InverseLess, from128(bt601InverseLess, -1220512)>; // truncates
+using InvExactD = InvExact<bt601InverseLess, from128(bt601InverseLess, -1187744)>; // rounds
+using InvExactE = InvExact<bt601InverseMore, from128(bt601InverseMore, -1187936)>; // rounds
+using InvExactF = InvExact<bt601Inverse, Three{-14608761, 8887730, -18140365}>;    // near to A
 
-using InvExactA = InvExact<InvExactWeights{76284, 104595, -25690, -53281, 132186, -1220544}>; // truncates
-using InvExactB = InvExact<InvExactWeights{76284, 104595, -25690, -53281, 132186, -1187776}>; // rounds
-using InvExactC = InvExact<InvExactWeights{76282, 104593, -25689, -53279, 132184, -1220512}>; // truncates
-using InvExactD = InvExact<InvExactWeights{76282, 104593, -25689, -53279, 132184, -1187744}>; // rounds
+/// In sixteenths of a step.
+using InvHighA = InvHigh<HighLuma<16, 9536>, ChromaAdded<HighWeights{13074, -3203, -6660, 16523}>, 8, 4>;
+using InvHighB = InvHigh<HighLuma<16, 9536>, ChromaAdded<HighWeights{13074, -3203, -6660, 16523}>, 0, 4>;
+using InvHighC = InvHigh<HighLuma<16, 9535>, ChromaAdded<HighWeights{13074, -3211, -6660, 16523}>, 8, 4>;
+using InvHighD = InvHigh<HighLuma<16, 9535>, ChromaTakenOff<HighWeights{13074, 3211, 6660, 16523}>, 8, 4>;
 
-/// What chroma adds to the three channels, in sixteenths of a step, in the high-product forms: one chroma sample's
-/// share serves all the pixels that it covers.
-template <int CbToG> struct ChromaAdded {
-    template <class Word> static PYXCC_INLINE auto shares(const Word& Cb, const Word& Cr)
-    {
-        const auto u = (Cb - 128) << 7, v = (Cr - 128) << 7;
-        return Three{mulHighS16(v, 13074), mulHighS16(v, -6660) + mulHighS16(u, CbToG), mulHighS16(u, 16523)};
-    }
-};
-
-/// The same with the shares of G taken off as magnitudes: a truncated product and the truncated negative product are
-/// not opposites.
-template <int CbToG> struct ChromaTakenOff {
-    template <class Word> static PYXCC_INLINE auto shares(const Word& Cb, const Word& Cr)
-    {
-        const auto u = (Cb - 128) << 7, v = (Cr - 128) << 7;
-        return Three{mulHighS16(v, 13074), 0 - mulHighS16(v, 6660) - mulHighS16(u, CbToG), mulHighS16(u, 16523)};
-    }
-};
-
-template <int LumaWeight, int Rounding, class Chroma> struct InvHigh : frame::OnWords, Chroma {
-    template <class Word, class S16> static PYXCC_INLINE auto add(const Word& Y, const Three<S16>& chroma)
-    {
-        const auto y = mulHighS16((Y - 16) << 7, LumaWeight) + Rounding;
-        return Three{sat8((y + chroma.a) >> 4), sat8((y + chroma.b) >> 4), sat8((y + chroma.c) >> 4)};
-    }
-
-    template <class Word> PYXCC_INLINE auto operator()(const Word& Y, const Word& Cb, const Word& Cr) const
-    {
-        return add(Y, Chroma::shares(Cb, Cr));
-    }
-};
-
-using InvHighA = InvHigh<9536, 8, ChromaAdded<-3203>>;
-using InvHighB = InvHigh<9536, 0, ChromaAdded<-3203>>;
-using InvHighC = InvHigh<9535, 8, ChromaAdded<-3211>>;
-using InvHighD = InvHigh<9535, 8, ChromaTakenOff<3211>>;
+/// In eighths of a step.
+inline constexpr HighWeights bt601Eighths{6537, 1606, 3330, 8262};
+inline constexpr HighWeights bt601EighthsMore{6537, 1605, 3330, 8263};
+using Inv3A = InvHigh<HighLuma<0, 4769>, ChromaOffset<bt601EighthsMore, Three{1779, 1089, 2211}>, 0, 3>;
+using Inv3B = InvHigh<HighLuma<0, 4768>, ChromaOffset<bt601Eighths, Three{1779, 1084, 2210}>, 0, 3>;
+using Inv3C = InvHigh<HighLuma<0, 4768>, ChromaOffset<bt601Eighths, Three{1783, 1085, 2214}>, 0, 3>;
+using Inv3D = InvHigh<HighLuma<16, 4769>, ChromaTakenOff<bt601EighthsMore>, 0, 3>;
 
 inline constexpr FwdExact fwdExact;
 inline constexpr FwdHigh fwdHigh;
@@ -91,9 +60,15 @@ inline constexpr InvExactA invExactA;
 inline constexpr InvExactB invExactB;
 inline constexpr InvExactC invExactC;
 inline constexpr InvExactD invExactD;
+inline constexpr InvExactE invExactE;
+inline constexpr InvExactF invExactF;
 inline constexpr InvHighA invHighA;
 inline constexpr InvHighB invHighB;
 inline constexpr InvHighC invHighC;
 inline constexpr InvHighD invHighD;
+inline constexpr Inv3A inv3A;
+inline constexpr Inv3B inv3B;
+inline constexpr Inv3C inv3C;
+inline constexpr Inv3D inv3D;
 
 } // namespace pyxcc::matrix

@@ -3,7 +3,7 @@
 
 #include "frame/checks.hpp"
 #include "frame/row_driver.hpp"
-#include "layouts/subsampled_targets.hpp"
+#include "layouts/shared_chroma.hpp"
 #include "subsampled/rgb_to_ycbcr_forms.hpp"
 #include "subsampled/wide_spans.hpp"
 

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "frame/forms.hpp"
-#include "layouts/subsampled_targets.hpp"
+#include "layouts/shared_chroma.hpp"
 
 namespace pyxcc::subsampled
 {
@@ -41,7 +41,7 @@ template <int Columns, class Luma, class Chroma>
 PYXCC_INLINE auto apply(const SharedForm<Columns, Luma, Chroma>& form, const Three<wide::U8>& row)
 {
     using layouts::sumsOf;
-    return layouts::SharedChroma<Columns, wide::U8>{
+    return layouts::ChromaOfSums<Columns, wide::U8>{
         apply(form.luma, row), form.chroma(sumsOf<Columns>(row.a), sumsOf<Columns>(row.b), sumsOf<Columns>(row.c))};
 }
 
@@ -51,7 +51,7 @@ PYXCC_INLINE auto apply(const SharedForm<Columns, Luma, Chroma>& form, const Two
     const auto sums = [](wide::U8 upper, wide::U8 lower) PYXCC_INLINE_LAMBDA {
         return layouts::sumsOf<Columns>(upper) + layouts::sumsOf<Columns>(lower);
     };
-    return layouts::SharedChroma<Columns, Two<wide::U8>>{
+    return layouts::ChromaOfSums<Columns, Two<wide::U8>>{
         {apply(form.luma, rows.a), apply(form.luma, rows.b)},
         form.chroma(sums(rows.a.a, rows.b.a), sums(rows.a.b, rows.b.b), sums(rows.a.c, rows.b.c))};
 }

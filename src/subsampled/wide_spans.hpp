@@ -27,6 +27,9 @@ template <int Block> constexpr int blocksByTwosThenHalf(int width)
 constexpr int wholePairs(int width) { return blocksOf<2>(width); }
 constexpr int wholeFours(int width) { return blocksOf<4>(width); }
 
+/// Fours, and three columns that are left over as well.
+constexpr int wholeFoursOrThree(int width) { return width % 4 == 3 ? width : wholeFours(width); }
+
 constexpr int everyColumn(int width) { return width; }
 
 /// The rule of a plan whose spans end as these functions of the width tell.

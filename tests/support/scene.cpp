@@ -67,7 +67,7 @@ std::vector<Geometry> geometriesOf(const Side& side, RoiSize roi, Stride stride,
                                                      : common;
         geometries.push_back(geometryOf(shape, side.element, step));
     }
-    for (Geometry& geometry : geometries) geometry.low -= side.bytesInFront;
+    if (side.byteInFront && roi.width == 1) --geometries[0].low;
     // Some conversions walk a chroma plane by the step of the other one.
     if (side.steps == Steps::each && side.planes > 2) shareExtent(geometries[1], geometries[2]);
     return geometries;

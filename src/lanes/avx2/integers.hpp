@@ -95,6 +95,8 @@ PYXCC_INLINE S16 mulRound15(S16 x, int k) { return S16(_mm256_mulhrs_epi16(x.v, 
 PYXCC_INLINE S16 mulHighS16(S16 x, int k) { return S16(_mm256_mulhi_epi16(x.v, S16(k).v)); }
 PYXCC_INLINE U16 mulHighU16(U16 x, int k) { return U16(_mm256_mulhi_epu16(x.v, U16(k).v)); }
 
+template <int Shift> PYXCC_INLINE S16 roundedShift(S16 x) { return mulRound15(x, 1 << (15 - Shift)); }
+
 PYXCC_INLINE S16 addSatS16(S16 x, S16 y) { return S16(_mm256_adds_epi16(x.v, y.v)); }
 PYXCC_INLINE S16 subSatS16(S16 x, S16 y) { return S16(_mm256_subs_epi16(x.v, y.v)); }
 PYXCC_INLINE U16 addSatU16(U16 x, U16 y) { return U16(_mm256_adds_epu16(x.v, y.v)); }
@@ -112,6 +114,17 @@ struct Sample : S16 {
         return static_cast<const S16&>(x) << n;
     }
 };
+
+/// Unsigned products serve where they come to the same: Weight is even, and what they give for Zero is whole.
+template <int Zero, int Weight> PYXCC_INLINE S16 highShare(const Sample& x)
+{
+    constexpr int atZero = 128 * Zero * Weight;
+    if constexpr (Weight > 0 && Weight % 2 == 0 && atZero % 65536 == 0) {
+        return asS16(mulHighU16(x.in256ths, Weight / 2)) - atZero / 65536;
+    } else {
+        return mulHighS16((x << 7) - 128 * Zero, Weight);
+    }
+}
 
 /// The bytes as words, zero-extended, in the order that narrow() takes back: each 128-bit lane is widened by itself.
 PYXCC_INLINE Two<Sample> widen(U8 x)

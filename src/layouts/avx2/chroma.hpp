@@ -26,6 +26,15 @@ PYXCC_INLINE wide::Sample widen(HalfBlock x)
     return {wide::S16(words), wide::U16(_mm256_slli_epi16(words, 8))};
 }
 
+/// The samples of 32 columns that `Columns` columns share, 2 or 4, as a word for each pair of columns.
+template <int Columns> PYXCC_INLINE wide::Sample loadForPairs(const u8* p)
+{
+    static_assert(Columns == 2 || Columns == 4);
+    if constexpr (Columns == 2) return widen(loadHalf(p));
+    const __m128i samples = _mm_loadl_epi64(reinterpret_cast<const __m128i*>(p));
+    return widen(HalfBlock{_mm_unpacklo_epi8(samples, samples)});
+}
+
 PYXCC_INLINE HalfBlock narrowHalf(wide::Byte x)
 {
     return {_mm_packus_epi16(_mm256_castsi256_si128(x.v), _mm256_extracti128_si256(x.v, 1))};
@@ -122,6 +131,57 @@ PYXCC_INLINE Two<wide::U8> loadAlternating(const u8* p)
     const __m256i even = _mm256_packus_epi16(_mm256_and_si256(first, low), _mm256_and_si256(second, low));
     const __m256i odd = _mm256_packus_epi16(_mm256_srli_epi16(first, 8), _mm256_srli_epi16(second, 8));
     return {wide::U8(detail::swapMiddle(even)), wide::U8(detail::swapMiddle(odd))};
+}
+
+/// The even bytes as words, and the odd ones.
+PYXCC_INLINE wide::Sample lowBytes(wide::U8 x)
+{
+    return {wide::S16(_mm256_and_si256(x.v, _mm256_set1_epi16(255))), wide::U16(_mm256_slli_epi16(x.v, 8))};
+}
+PYXCC_INLINE wide::Sample highBytes(wide::U8 x)
+{
+    return {wide::S16(_mm256_srli_epi16(x.v, 8)), wide::U16(_mm256_andnot_si256(_mm256_set1_epi16(255), x.v))};
+}
+
+/// Reads 32 pixels of two bytes. Their even bytes, or their odd ones, come as those of a block do that is widened: the
+/// first and the third quarter, the second and the fourth.
+PYXCC_INLINE Two<wide::U8> loadForWidening(const u8* p)
+{
+    const auto quarters = [p](int first, int second) PYXCC_INLINE_LAMBDA {
+        const __m256i low = _mm256_castsi128_si256(loadHalf(p + 16 * first).v);
+        return wide::U8(_mm256_inserti128_si256(low, loadHalf(p + 16 * second).v, 1));
+    };
+    return {quarters(0, 2), quarters(1, 3)};
+}
+
+namespace detail
+{
+
+/// Of every four bytes of a lane, those at `First` and two behind, each component by itself. `Byte` is where in a word
+/// they are put; the rest is zero.
+template <int First, int Byte>
+constexpr Places everyFourth = [] {
+    Places places{};
+    places.fill(0x80);
+    for (int i = 0; i < 8; ++i) places[2 * i + Byte] = static_cast<u8>(First + 4 * (i % 4) + 2 * (i / 4));
+    return places;
+}();
+
+template <int First, int Byte> PYXCC_INLINE Two<wide::U16> everyOther(const Two<wide::U8>& x)
+{
+    const __m256i a = shuffle(x.a.v, everyFourth<First, Byte>), b = shuffle(x.b.v, everyFourth<First, Byte>);
+    return {wide::U16(_mm256_unpacklo_epi64(a, b)), wide::U16(_mm256_unpackhi_epi64(a, b))};
+}
+
+} // namespace detail
+
+/// The two chroma components of pixels in which each byte of luma is preceded or followed by one of chroma, by turns
+/// one of each component: a word of each for every pair.
+template <int First> PYXCC_INLINE Two<wide::Sample> chromaOfPairs(const Two<wide::U8>& pixels)
+{
+    const Two<wide::U16> words = detail::everyOther<First, 0>(pixels);
+    const Two<wide::U16> in256ths = detail::everyOther<First, 1>(pixels);
+    return {{asS16(words.a), in256ths.a}, {asS16(words.b), in256ths.b}};
 }
 
 /// Writes 64 bytes, the even ones from `even`.

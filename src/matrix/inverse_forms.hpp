@@ -1,0 +1,101 @@
+// The inverse forms over their constants: Y, Cb, Cr in, R, G, B out, as templates over 16-bit lanes.
+#pragma once
+
+#include "frame/forms.hpp"
+#include "lanes/lanes.hpp"
+
+namespace pyxcc::matrix
+{
+
+/// What a step of each sample adds to the channels.
+struct InverseWeights {
+    int y, crToR, cbToG, crToG, cbToB;
+};
+
+/// 32-bit sums in 65536ths of a step; what is added to the channels includes that chroma counts from 128.
+template <InverseWeights k, Three<int> Addends> struct InvExact : frame::OnWords {
+    template <class Word> PYXCC_INLINE auto operator()(const Word& Y, const Word& Cb, const Word& Cr) const
+    {
+        return Three{sat8(exactSum<16, Addends.a, k.y, k.crToR>(Y, Cr)),
+                     sat8(exactSum<16, Addends.b, k.y, k.cbToG, k.crToG>(Y, Cb, Cr)),
+                     sat8(exactSum<16, Addends.c, k.y, k.cbToB>(Y, Cb))};
+    }
+};
+
+/// One addend for all, with chroma counted from 128.
+constexpr Three<int> from128(InverseWeights k, int addend)
+{
+    return {addend - 128 * k.crToR, addend - 128 * (k.cbToG + k.crToG), addend - 128 * k.cbToB};
+}
+
+// The high-product forms. One chroma sample's share in the channels serves all the pixels that it covers, so that a
+// form is two parts: `shares` of chroma, and `add` of them to a pixel's luma.
+
+/// Luma in the scale of the shares.
+template <int Zero, int Weight> struct HighLuma {
+    template <class Word> static PYXCC_INLINE auto scaled(const Word& Y) { return highShare<Zero, Weight>(Y); }
+};
+
+/// Luma of full range, in sixteenths.
+struct LumaSixteenths {
+    template <class Word> static PYXCC_INLINE auto scaled(const Word& Y) { return Y << 4; }
+};
+
+/// Weights of the high products; those of G are taken as the form below has them, added or taken off.
+struct HighWeights {
+    int crToR, cbToG, crToG, cbToB;
+};
+
+/// What chroma adds.
+template <HighWeights k> struct ChromaAdded {
+    template <class Word> static PYXCC_INLINE auto shares(const Word& Cb, const Word& Cr)
+    {
+        return Three{highShare<128, k.crToR>(Cr), highShare<128, k.crToG>(Cr) + highShare<128, k.cbToG>(Cb),
+                     highShare<128, k.cbToB>(Cb)};
+    }
+};
+
+/// The same with the shares of G taken off as magnitudes: a truncated product and the truncated negative product are
+/// not opposites.
+template <HighWeights k> struct ChromaTakenOff {
+    template <class Word> static PYXCC_INLINE auto shares(const Word& Cb, const Word& Cr)
+    {
+        return Three{highShare<128, k.crToR>(Cr), 0 - highShare<128, k.crToG>(Cr) - highShare<128, k.cbToG>(Cb),
+                     highShare<128, k.cbToB>(Cb)};
+    }
+};
+
+/// Chroma counted from 0, magnitudes taken off in G: what it adds at 128, and 16 steps of luma, are in the offsets.
+template <HighWeights k, Three<int> Offsets> struct ChromaOffset {
+    template <class Word> static PYXCC_INLINE auto shares(const Word& Cb, const Word& Cr)
+    {
+        return Three{highShare<0, k.crToR>(Cr) - Offsets.a,
+                     Offsets.b - highShare<0, k.cbToG>(Cb) - highShare<0, k.crToG>(Cr),
+                     highShare<0, k.cbToB>(Cb) - Offsets.c};
+    }
+};
+
+template <class Luma, class Chroma, int Rounding, int Shift> struct InvHigh : frame::OnWords, Chroma {
+    template <class Word, class Share> static PYXCC_INLINE auto add(const Word& Y, const Three<Share>& chroma)
+    {
+        const auto y = Luma::scaled(Y);
+        return Three{rounded(y + chroma.a), rounded(y + chroma.b), rounded(y + chroma.c)};
+    }
+
+    template <class Word> PYXCC_INLINE auto operator()(const Word& Y, const Word& Cb, const Word& Cr) const
+    {
+        return add(Y, Chroma::shares(Cb, Cr));
+    }
+
+private:
+    template <class Sum> static PYXCC_INLINE auto rounded(const Sum& sum)
+    {
+        if constexpr (Rounding == 1 << (Shift - 1)) {
+            return sat8(roundedShift<Shift>(sum));
+        } else {
+            return sat8((sum + Rounding) >> Shift);
+        }
+    }
+};
+
+} // namespace pyxcc::matrix
