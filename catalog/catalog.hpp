@@ -24,6 +24,7 @@ std::string_view nameOf(Element element);
 
 enum class Family {
     colorTwist,
+    gamma,
     rgbYCbCr,
     rgbToSubsampled,
     subsampledToRgb,
@@ -90,6 +91,10 @@ inline constexpr Parameter twist3x4{
     "twist", -2, 2, 12, {0.6495, 0.2935, 0.057, 0, 0.1495, 0.7935, 0.057, 0, 0.1495, 0.2935, 0.557, 0}};
 inline constexpr Parameter twist4x4{
     "twist", -2, 2, 16, {0.6495, 0.2935, 0.057, 0, 0.1495, 0.7935, 0.057, 0, 0.1495, 0.2935, 0.557, 0, 0, 0, 0, 1}};
+
+/// Bounds of floats, which the standard samples go up to and some others beyond.
+inline constexpr Parameter vMin{"vMin", -1, 0.25, 0, {0}};
+inline constexpr Parameter vMax{"vMax", 0.5, 2, 0, {1}, pyxErrRange, true};
 
 /// What the signature tells of a parameter.
 struct ParameterType {

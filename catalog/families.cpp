@@ -12,6 +12,9 @@ constexpr FamilyInfo table[] = {
     {Family::colorTwist, "color-twist", "Colour twists",
      "A 3 by 4 matrix of the caller's over every pixel, in 8-bit, 16-bit and float samples; a 4 by 4 one over four "
      "channels of floats."},
+    {Family::gamma, "gamma", "Gamma",
+     "The transfer curve of video over three channels, and its inverse: 8-bit and 16-bit samples, and floats between "
+     "two bounds."},
     {Family::rgbYCbCr, "rgb-ycbcr", "RGB and YCbCr at full resolution",
      "8-bit RGB to BT.601 studio-range YCbCr and back, one chroma sample a pixel."},
     {Family::rgbToSubsampled, "rgb-to-subsampled", "RGB to subsampled YCbCr",

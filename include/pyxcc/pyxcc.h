@@ -7,6 +7,7 @@
 
 #include "pyxcc/bt709.h"
 #include "pyxcc/color_twist.h"
+#include "pyxcc/gamma.h"
 #include "pyxcc/rgb_to_subsampled.h"
 #include "pyxcc/rgb_ycbcr.h"
 #include "pyxcc/subsampled_to_rgb.h"

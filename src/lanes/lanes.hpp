@@ -1,9 +1,12 @@
 // The arithmetic vocabulary: namespace scalar over one value, namespace wide over a register of this build's variant.
 #pragma once
 
+#include "lanes/avx2/byte_curve.hpp"
 #include "lanes/avx2/control_word.hpp"
+#include "lanes/avx2/doubles.hpp"
 #include "lanes/avx2/exact_sum.hpp"
 #include "lanes/avx2/floats.hpp"
 #include "lanes/avx2/integers.hpp"
 #include "lanes/avx2/samples.hpp"
 #include "lanes/scalar.hpp"
+#include "lanes/several.hpp"

@@ -9,6 +9,7 @@
 #include "pyxcc/types.h"
 
 #include <algorithm>
+#include <bit>
 #include <cmath>
 #include <concepts>
 #include <cstdint>
@@ -26,6 +27,7 @@ template <std::integral T> struct Lane {
     friend Lane operator+(Lane x, Lane y) { return wrap(bits(x) + bits(y)); }
     friend Lane operator-(Lane x, Lane y) { return wrap(bits(x) - bits(y)); }
     friend Lane operator*(Lane x, Lane y) { return wrap(bits(x) * bits(y)); }
+    friend Lane operator&(Lane x, Lane y) { return wrap(bits(x) & bits(y)); }
     friend Lane operator<<(Lane x, int n) { return wrap(bits(x) << n); }
     friend Lane operator>>(Lane x, int n) { return Lane(static_cast<int>(x.v >> n)); }
 
@@ -47,6 +49,7 @@ template <std::floating_point T> struct Float {
 
     friend Float operator+(Float x, Float y) { return x.v + y.v; }
     friend Float operator-(Float x, Float y) { return x.v - y.v; }
+    friend Float operator-(Float x) { return -x.v; }
     friend Float operator*(Float x, Float y) { return x.v * y.v; }
     friend Float operator/(Float x, Float y) { return x.v / y.v; }
 };
@@ -94,7 +97,28 @@ inline F64 fused(F64 x, F64 y, F64 z) { return std::fma(x.v, y.v, z.v); }
 inline F32 lesser(F32 x, F32 y) { return x.v < y.v ? x : y; }
 inline F32 greater(F32 x, F32 y) { return x.v > y.v ? x : y; }
 
+/// A NaN on either side gives y, or `no`.
+inline F64 greater(F64 x, F64 y) { return x.v > y.v ? x : y; }
+inline F64 whereLess(F64 x, F64 y, F64 yes, F64 no) { return x.v < y.v ? yes : no; }
+inline S32 whereEqual(F32 x, F32 y, S32 yes, S32 no) { return x.v == y.v ? yes : no; }
+
+inline F64 sqrt(F64 x) { return std::sqrt(x.v); }
+
 inline F32 toF32(S32 x) { return static_cast<f32>(x.v); }
+inline F32 toF32(F64 x) { return static_cast<f32>(x.v); }
+inline F64 toF64(F32 x) { return x.v; }
+
+/// Sign, exponent, and 20 bits of the mantissa.
+inline S32 upperWords(F64 x) { return static_cast<s32>(std::bit_cast<std::uint64_t>(x.v) >> 32); }
+
+/// To an integer, ties to even, whatever the rounding mode.
+inline F32 roundedToEven(F32 x) { return x.v - std::remainder(x.v, 1.0f); }
+
+/// x times 2 to the n, which is an integer; neither x nor the result may leave the range of normal numbers.
+inline F32 timesPowerOf2(F32 x, F32 n) { return std::ldexp(x.v, static_cast<int>(n.v)); }
+
+/// Clears the last bits of the mantissa.
+inline F32 withoutLowBits(F32 x, int count) { return std::bit_cast<f32>(std::bit_cast<u32>(x.v) & ~0u << count); }
 
 /// Out of range and NaN give the lowest integer.
 inline S32 trunc(F32 x) { return x.v >= -0x1p31f && x.v < 0x1p31f ? static_cast<s32>(x.v) : INT32_MIN; }

@@ -68,6 +68,13 @@ template <class Sample> auto c4(Sample* first, std::ptrdiff_t step, std::type_id
     return detail::interleaved(first, step, C4Set<detail::RegisterOf<Sample>>{fourth});
 }
 
+/// Pixels of 1, 3 or 4 samples, for forms to which all channels are alike; a fourth takes no part, and a target keeps
+/// it.
+template <int PixelSamples, class Sample> auto asItLies(Sample* first, std::ptrdiff_t step)
+{
+    return detail::interleaved(first, step, AsTheyLie<detail::RegisterOf<Sample>, PixelSamples>{});
+}
+
 /// Three planes with one step.
 template <class Sample> auto p3(Sample* const planes[3], std::ptrdiff_t step)
 {

@@ -1,9 +1,11 @@
 // Rows: blocks of pixels loaded and stored by their first column, whole or in part.
 //
-// A block is as many pixels as a register holds samples. A partial block passes through a buffer of a whole one,
-// cleared first, so that nothing beyond the row is read or written and the lanes without a pixel compute on zeros.
+// A block is as many pixels as a register holds samples, or as several registers do. A partial block passes through a
+// buffer of a whole one, cleared first, so that nothing beyond the row is read or written and the lanes without a pixel
+// compute on zeros.
 #pragma once
 
+#include "lanes/several.hpp"
 #include "layouts/avx2/interleave.hpp"
 #include "layouts/bytes.hpp"
 
@@ -71,8 +73,42 @@ private:
     static PYXCC_INLINE Three<Samples> reverse(const Three<Samples>& x) { return {x.c, x.b, x.a}; }
 };
 
+/// Registers of samples as they lie, for forms to which all channels are alike. Of pixels of four samples the first
+/// three take part: a store puts the fourth back as it was.
+template <class Register, int PixelSamples> struct AsTheyLie {
+    using Samples = Register;
+    /// Floats are what long computations are made on: a plane gives them two registers at once.
+    static constexpr int registers = PixelSamples == 1 && sampleBytes<Samples> == 4 ? 2 : PixelSamples;
+    static constexpr int block = registers * Samples::count / PixelSamples;
+    static constexpr int pixelBytes = PixelSamples * sampleBytes<Samples>;
+    static constexpr bool readsTarget = PixelSamples == 4;
+
+    static PYXCC_INLINE Several<Samples, registers> load(const u8* p)
+    {
+        Several<Samples, registers> samples;
+        for (int i = 0; i < registers; ++i) samples.part[i] = loadSamples<Samples>(p + 32 * i);
+        return samples;
+    }
+
+    static PYXCC_INLINE void store(u8* p, const Several<Samples, registers>& samples)
+    {
+        for (int i = 0; i < registers; ++i) {
+            if constexpr (PixelSamples == 4) {
+                storeButFourths(p + 32 * i, samples.part[i]);
+            } else {
+                storeSamples(p + 32 * i, samples.part[i]);
+            }
+        }
+    }
+};
+
+/// The pixels of a block: those of a register of samples, or what the packing says.
+template <class Packing> inline constexpr int blockOf = Packing::Samples::count;
+template <class Register, int PixelSamples>
+inline constexpr int blockOf<AsTheyLie<Register, PixelSamples>> = AsTheyLie<Register, PixelSamples>::block;
+
 template <class Packing, class Byte> struct InterleavedRow {
-    static constexpr int block = Packing::Samples::count;
+    static constexpr int block = blockOf<Packing>;
     static constexpr int pixelBytes = Packing::pixelBytes;
     Byte* at;
     Packing packing;

@@ -30,6 +30,7 @@ struct F64 {
 
     friend PYXCC_INLINE F64 operator+(F64 x, F64 y) { return F64(_mm256_add_pd(x.v, y.v)); }
     friend PYXCC_INLINE F64 operator-(F64 x, F64 y) { return F64(_mm256_sub_pd(x.v, y.v)); }
+    friend PYXCC_INLINE F64 operator-(F64 x) { return F64(-x.v); }
     friend PYXCC_INLINE F64 operator*(F64 x, F64 y) { return F64(_mm256_mul_pd(x.v, y.v)); }
     friend PYXCC_INLINE F64 operator/(F64 x, F64 y) { return F64(_mm256_div_pd(x.v, y.v)); }
 };

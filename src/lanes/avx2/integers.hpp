@@ -71,6 +71,7 @@ struct S32 {
     friend PYXCC_INLINE S32 operator+(S32 x, S32 y) { return S32(_mm256_add_epi32(x.v, y.v)); }
     friend PYXCC_INLINE S32 operator-(S32 x, S32 y) { return S32(_mm256_sub_epi32(x.v, y.v)); }
     friend PYXCC_INLINE S32 operator*(S32 x, S32 y) { return S32(_mm256_mullo_epi32(x.v, y.v)); }
+    friend PYXCC_INLINE S32 operator&(S32 x, S32 y) { return S32(_mm256_and_si256(x.v, y.v)); }
     friend PYXCC_INLINE S32 operator<<(S32 x, int n) { return S32(_mm256_slli_epi32(x.v, n)); }
     friend PYXCC_INLINE S32 operator>>(S32 x, int n) { return S32(_mm256_srai_epi32(x.v, n)); }
 };

@@ -183,27 +183,30 @@ template <class Samples> PYXCC_INLINE void storeQuadruples(u8* p, const Four<Sam
     detail::storeWhole(p + 96, x.d.v);
 }
 
+/// Writes 32 bytes of pixels of four samples; each fourth sample is put back as it was.
+template <class Samples> PYXCC_INLINE void storeButFourths(u8* p, Samples samples)
+{
+    constexpr int bytes = sampleBytes<Samples>;
+    const __m256i v = detail::raw(samples), old = detail::loadWhole(p);
+    if constexpr (bytes == 4) {
+        detail::storeWhole(p, _mm256_blend_epi32(v, old, 0x88));
+    } else if constexpr (bytes == 2) {
+        detail::storeWhole(p, _mm256_blend_epi16(v, old, 0x88));
+    } else {
+        const __m256i fourth = _mm256_set1_epi32(static_cast<int>(0xff000000u));
+        detail::storeWhole(p, _mm256_blendv_epi8(v, old, fourth));
+    }
+}
+
 /// Writes the first three samples of a block of pixels of four; each fourth sample is put back as it was.
 template <class Samples> PYXCC_INLINE void storeTriplesOfQuadruples(u8* p, const Three<Samples>& pixels)
 {
-    constexpr int bytes = sampleBytes<Samples>;
     const Four<wide::U8> x =
         detail::interleave(Four<Samples>{pixels.a, pixels.b, pixels.c, detail::as<Samples>(_mm256_setzero_si256())});
-    const auto store = [](u8* at, wide::U8 pixels32) PYXCC_INLINE_LAMBDA {
-        const __m256i old = detail::loadWhole(at);
-        if constexpr (bytes == 4) {
-            detail::storeWhole(at, _mm256_blend_epi32(pixels32.v, old, 0x88));
-        } else if constexpr (bytes == 2) {
-            detail::storeWhole(at, _mm256_blend_epi16(pixels32.v, old, 0x88));
-        } else {
-            const __m256i fourth = _mm256_set1_epi32(static_cast<int>(0xff000000u));
-            detail::storeWhole(at, _mm256_blendv_epi8(pixels32.v, old, fourth));
-        }
-    };
-    store(p, x.a);
-    store(p + 32, x.b);
-    store(p + 64, x.c);
-    store(p + 96, x.d);
+    storeButFourths(p, detail::as<Samples>(x.a.v));
+    storeButFourths(p + 32, detail::as<Samples>(x.b.v));
+    storeButFourths(p + 64, detail::as<Samples>(x.c.v));
+    storeButFourths(p + 96, detail::as<Samples>(x.d.v));
 }
 
 template <class Samples = wide::U8> PYXCC_INLINE Samples loadSamples(const u8* p)

@@ -1,0 +1,67 @@
+// The video transfer curve, a line near black and a power above it, and its inverse.
+#pragma once
+
+#include "frame/sample_forms.hpp"
+#include "tone/power.hpp"
+
+namespace pyxcc::tone
+{
+
+/// The curves over doubles from 0 to 1 and beyond: a line of this slope below the threshold, and from there, for NaN
+/// too, what curved() says.
+struct ForwardCurve {
+    static constexpr f64 threshold = 0.018;
+    static constexpr f64 slope = 4.5;
+    template <class F64> static PYXCC_INLINE F64 curved(const F64& x) { return fused(power045(x), 1.099, -0.099); }
+};
+
+struct InverseCurve {
+    static constexpr f64 threshold = 0.0812;
+    static constexpr f64 slope = 0.2222222222222222;
+    template <class F64> static PYXCC_INLINE F64 curved(const F64& x)
+    {
+        return power222((x + 0.099) * 0.9099181073703366); // one unit in the last place from 1 / 1.099
+    }
+};
+
+/// Bytes, by a table.
+template <const ByteCurve& curve> struct GammaOfBytes : frame::OnSamples {
+    template <class Samples> PYXCC_INLINE auto operator()(const Samples& samples) const
+    {
+        return each([](auto x) PYXCC_INLINE_LAMBDA { return lookUp<curve>(x); }, samples);
+    }
+};
+
+/// Words, which come as floats. Rounding goes by way of a float: what is near below a half can so get to the next
+/// integer, and one that is met exactly becomes even.
+template <class Curve> struct GammaOfWords : frame::OnSamples {
+    template <class F32> PYXCC_INLINE auto operator()(const F32& samples) const
+    {
+        const auto v = toF64(samples);
+        const auto x = v * 1.5259021896696422e-5;
+        const auto curved = Curve::curved(greater(Curve::threshold, x)) * 65535.0;
+        const auto z = toF32(whereLess(x, Curve::threshold, v * Curve::slope, curved) + 0.5);
+        const auto t = trunc(z);
+        return whereEqual(z, toF32(t), t & ~1, t);
+    }
+};
+
+/// Floats between two bounds, which are where the curve has 0 and 1.
+template <class Curve> struct GammaBetween : frame::OnSamples {
+    f32 vMin;
+    f64 range, inverse;
+
+    GammaBetween(f32 low, f32 high) : vMin(low), range(high - low), inverse(1.0 / range) {}
+
+    template <class F32> PYXCC_INLINE auto operator()(const F32& samples) const
+    {
+        const auto d = toF64(samples - vMin);
+        const auto x = d * inverse;
+        const f64 base = vMin;
+        const auto line = fused(d, Curve::slope, base);
+        const auto curved = fused(Curve::curved(greater(Curve::threshold, x)), range, base);
+        return toF32(whereLess(x, Curve::threshold, line, curved));
+    }
+};
+
+} // namespace pyxcc::tone
