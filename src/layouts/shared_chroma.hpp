@@ -223,8 +223,9 @@ struct ChromaFirst {
 template <class Packing> struct ChromaExchanged : Packing {
     static PYXCC_INLINE auto load(const u8* p)
     {
-        const auto pixels = Packing::load(p);
-        return decltype(Packing::load(p)){pixels.luma, exchanged(pixels.chroma)};
+        auto pixels = Packing::load(p);
+        pixels.chroma = exchanged(pixels.chroma);
+        return pixels;
     }
 
     static PYXCC_INLINE void store(u8* p, const ChromaOfSums<2, wide::U8>& pixels)

@@ -10,33 +10,45 @@
 namespace pyxcc::wide
 {
 
-/// 32 samples of 8 bits, as they lie in memory.
-struct U8 {
-    static constexpr int count = 32;
+/// A register of integers. Its copies are spelled out for the compiler's sake: groups of registers are then copied one
+/// by one and stay in registers, while a group that can be copied as bytes goes through memory.
+struct Integers {
     __m256i v;
 
+    Integers() = default;
+    PYXCC_INLINE explicit Integers(__m256i value) : v(value) {}
+    PYXCC_INLINE Integers(const Integers& other) : v(other.v) {}
+    PYXCC_INLINE Integers& operator=(const Integers& other)
+    {
+        v = other.v;
+        return *this;
+    }
+};
+
+/// 32 samples of 8 bits, as they lie in memory.
+struct U8 : Integers {
+    static constexpr int count = 32;
+
     U8() = default;
-    PYXCC_INLINE explicit U8(__m256i value) : v(value) {}
-    PYXCC_INLINE U8(int k) : v(_mm256_set1_epi8(static_cast<char>(k))) {}
+    PYXCC_INLINE explicit U8(__m256i value) : Integers(value) {}
+    PYXCC_INLINE U8(int k) : Integers(_mm256_set1_epi8(static_cast<char>(k))) {}
 };
 
 /// 32 signed samples of 8 bits, as they lie in memory.
-struct S8 {
+struct S8 : Integers {
     static constexpr int count = 32;
-    __m256i v;
 
     S8() = default;
-    PYXCC_INLINE explicit S8(__m256i value) : v(value) {}
-    PYXCC_INLINE S8(int k) : v(_mm256_set1_epi8(static_cast<char>(k))) {}
+    PYXCC_INLINE explicit S8(__m256i value) : Integers(value) {}
+    PYXCC_INLINE S8(int k) : Integers(_mm256_set1_epi8(static_cast<char>(k))) {}
 };
 
-struct S16 {
+struct S16 : Integers {
     static constexpr int count = 16;
-    __m256i v;
 
     S16() = default;
-    PYXCC_INLINE explicit S16(__m256i value) : v(value) {}
-    PYXCC_INLINE S16(int k) : v(_mm256_set1_epi16(static_cast<short>(k))) {}
+    PYXCC_INLINE explicit S16(__m256i value) : Integers(value) {}
+    PYXCC_INLINE S16(int k) : Integers(_mm256_set1_epi16(static_cast<short>(k))) {}
 
     friend PYXCC_INLINE S16 operator+(S16 x, S16 y) { return S16(_mm256_add_epi16(x.v, y.v)); }
     friend PYXCC_INLINE S16 operator-(S16 x, S16 y) { return S16(_mm256_sub_epi16(x.v, y.v)); }
@@ -45,13 +57,12 @@ struct S16 {
     friend PYXCC_INLINE S16 operator>>(S16 x, int n) { return S16(_mm256_srai_epi16(x.v, n)); }
 };
 
-struct U16 {
+struct U16 : Integers {
     static constexpr int count = 16;
-    __m256i v;
 
     U16() = default;
-    PYXCC_INLINE explicit U16(__m256i value) : v(value) {}
-    PYXCC_INLINE U16(int k) : v(_mm256_set1_epi16(static_cast<short>(k))) {}
+    PYXCC_INLINE explicit U16(__m256i value) : Integers(value) {}
+    PYXCC_INLINE U16(int k) : Integers(_mm256_set1_epi16(static_cast<short>(k))) {}
 
     friend PYXCC_INLINE U16 operator+(U16 x, U16 y) { return U16(_mm256_add_epi16(x.v, y.v)); }
     friend PYXCC_INLINE U16 operator-(U16 x, U16 y) { return U16(_mm256_sub_epi16(x.v, y.v)); }
@@ -60,13 +71,12 @@ struct U16 {
     friend PYXCC_INLINE U16 operator>>(U16 x, int n) { return U16(_mm256_srli_epi16(x.v, n)); }
 };
 
-struct S32 {
+struct S32 : Integers {
     static constexpr int count = 8;
-    __m256i v;
 
     S32() = default;
-    PYXCC_INLINE explicit S32(__m256i value) : v(value) {}
-    PYXCC_INLINE S32(int k) : v(_mm256_set1_epi32(k)) {}
+    PYXCC_INLINE explicit S32(__m256i value) : Integers(value) {}
+    PYXCC_INLINE S32(int k) : Integers(_mm256_set1_epi32(k)) {}
 
     friend PYXCC_INLINE S32 operator+(S32 x, S32 y) { return S32(_mm256_add_epi32(x.v, y.v)); }
     friend PYXCC_INLINE S32 operator-(S32 x, S32 y) { return S32(_mm256_sub_epi32(x.v, y.v)); }
@@ -77,8 +87,9 @@ struct S32 {
 };
 
 /// Samples in 16-bit lanes that narrow() stores as bytes. Clamping is left to narrow(), which does it at no cost.
-struct Byte {
-    __m256i v;
+struct Byte : Integers {
+    Byte() = default;
+    PYXCC_INLINE Byte(__m256i value) : Integers(value) {}
 };
 
 PYXCC_INLINE U16 asU16(S16 x) { return U16(x.v); }
