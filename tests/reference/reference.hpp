@@ -4,6 +4,7 @@
 #include "reference/bt709.hpp"
 #include "reference/color_twist.hpp"
 #include "reference/gamma.hpp"
+#include "reference/repack.hpp"
 #include "reference/rgb_to_subsampled.hpp"
 #include "reference/rgb_ycbcr.hpp"
 #include "reference/subsampled_to_rgb.hpp"
