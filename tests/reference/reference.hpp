@@ -2,6 +2,7 @@
 #pragma once
 
 #include "reference/bt709.hpp"
+#include "reference/cbycr422.hpp"
 #include "reference/color_twist.hpp"
 #include "reference/gamma.hpp"
 #include "reference/repack.hpp"

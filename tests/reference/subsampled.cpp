@@ -68,4 +68,17 @@ void fromSubsampled(const Image<const u8>& ycbcr, const Image<u8>& rgb, RoiSize 
     }
 }
 
+void fromPacked(const Image<const u8>& ycbcr, const Image<u8>& rgb, RoiSize roi, First first, int wideColumns,
+                InverseForm wide, InverseForm tail)
+{
+    fromSubsampled(ycbcr, rgb, wholeBlocks(roi, block422), block422, wideColumns, wide, tail);
+    if (roi.width % 2 == 0) return;
+    const int column = roi.width - 1;
+    const int own = column / 2, before = own - 1;
+    for (int row = 0; row < roi.height; ++row) {
+        const ChromaPlace chroma = first == First::cb ? ChromaPlace{row, own, before} : ChromaPlace{row, before, own};
+        convertPixel(ycbcr, rgb, row, column, chroma, tail);
+    }
+}
+
 } // namespace reference

@@ -98,4 +98,9 @@ void convertPixel(const Image<const u8>& ycbcr, const Image<u8>& rgb, int row, i
 void fromSubsampled(const Image<const u8>& ycbcr, const Image<u8>& rgb, RoiSize roi, Block block, int wideColumns,
                     InverseForm wide, InverseForm tail);
 
+/// Every pixel of a packed image. The last pixel of an odd width has the first chroma sample of its pair, and for want
+/// of the second one that of the pair before. In a row of one pixel that lies before the row.
+void fromPacked(const Image<const u8>& ycbcr, const Image<u8>& rgb, RoiSize roi, First first, int wideColumns,
+                InverseForm wide, InverseForm tail);
+
 } // namespace reference

@@ -29,21 +29,6 @@ void from420(const Image<const u8>& ycbcr, const Image<u8>& rgb, RoiSize roi, In
 /// Alpha of the pixels that are converted.
 void fillAlpha420(const Image<u8>& rgba, RoiSize roi, u8 aval) { fill(rgba[3], wholeBlocks(roi, block420), aval); }
 
-/// The last pixel of an odd width has the first chroma sample of its pair, and for want of the second one that of the
-/// pair before. In a row of one pixel that is the byte before the row.
-void fromPacked(const Image<const u8>& ycbcr, const Image<u8>& rgb, RoiSize roi, First first, int wideColumns,
-                InverseForm wide, InverseForm tail)
-{
-    fromSubsampled(ycbcr, rgb, wholeBlocks(roi, block422), block422, wideColumns, wide, tail);
-    if (roi.width % 2 == 0) return;
-    const int column = roi.width - 1;
-    const int own = column / 2, before = own - 1;
-    for (int row = 0; row < roi.height; ++row) {
-        const ChromaPlace chroma = first == First::cb ? ChromaPlace{row, own, before} : ChromaPlace{row, before, own};
-        convertPixel(ycbcr, rgb, row, column, chroma, tail);
-    }
-}
-
 /// The pixels after the last whole block take its chroma. They are in the wide form if there are three of them.
 void from411(const Image<const u8>& ycbcr, const Image<u8>& rgb, RoiSize roi)
 {
