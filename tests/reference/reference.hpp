@@ -4,6 +4,7 @@
 #include "reference/bt709.hpp"
 #include "reference/cbycr422.hpp"
 #include "reference/color_twist.hpp"
+#include "reference/filter_interlace.hpp"
 #include "reference/gamma.hpp"
 #include "reference/repack.hpp"
 #include "reference/rgb_to_subsampled.hpp"
