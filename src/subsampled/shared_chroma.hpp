@@ -40,20 +40,20 @@ PYXCC_INLINE wide::U8 apply(const ByColumn<Even, Odd>& form, const Three<wide::U
 template <int Columns, class Luma, class Chroma>
 PYXCC_INLINE auto apply(const SharedForm<Columns, Luma, Chroma>& form, const Three<wide::U8>& row)
 {
-    using layouts::sumsOf;
-    return layouts::ChromaOfSums<Columns, wide::U8>{
-        apply(form.luma, row), form.chroma(sumsOf<Columns>(row.a), sumsOf<Columns>(row.b), sumsOf<Columns>(row.c))};
+    using Sums = layouts::Sums<Columns, wide::U8>;
+    return layouts::ChromaOfSums<Columns, wide::U8>{apply(form.luma, row),
+                                                    form.chroma(Sums(row.a), Sums(row.b), Sums(row.c))};
 }
 
 template <int Columns, class Luma, class Chroma>
 PYXCC_INLINE auto apply(const SharedForm<Columns, Luma, Chroma>& form, const Two<Three<wide::U8>>& rows)
 {
-    const auto sums = [](wide::U8 upper, wide::U8 lower) PYXCC_INLINE_LAMBDA {
-        return layouts::sumsOf<Columns>(upper) + layouts::sumsOf<Columns>(lower);
-    };
+    const auto& [upper, lower] = rows;
+    using Rows = Two<wide::U8>;
+    using Sums = layouts::Sums<Columns, Rows>;
     return layouts::ChromaOfSums<Columns, Two<wide::U8>>{
-        {apply(form.luma, rows.a), apply(form.luma, rows.b)},
-        form.chroma(sums(rows.a.a, rows.b.a), sums(rows.a.b, rows.b.b), sums(rows.a.c, rows.b.c))};
+        {apply(form.luma, upper), apply(form.luma, lower)},
+        form.chroma(Sums(Rows{upper.a, lower.a}), Sums(Rows{upper.b, lower.b}), Sums(Rows{upper.c, lower.c}))};
 }
 
 /// A form that takes the one for the other.

@@ -40,18 +40,39 @@ PYXCC_INLINE HalfBlock narrowHalf(wide::Byte x)
     return {_mm_packus_epi16(_mm256_castsi256_si128(x.v), _mm256_extracti128_si256(x.v, 1))};
 }
 
-/// Each sum of two neighbours, in order.
-PYXCC_INLINE wide::S16 pairSums(wide::U8 x) { return wide::S16(_mm256_maddubs_epi16(x.v, _mm256_set1_epi8(1))); }
-
-/// Each sum of `Columns` neighbours, 2 or 4. Sums of fours stand in the even words, in order, and the odd words are
-/// zero.
-template <int Columns> PYXCC_INLINE wide::S16 sumsOf(wide::U8 x)
+namespace detail
 {
-    static_assert(Columns == 2 || Columns == 4);
-    const wide::S16 pairs = pairSums(x);
-    if constexpr (Columns == 2) return pairs;
-    return wide::S16(_mm256_madd_epi16(pairs.v, _mm256_set1_epi16(1)));
+
+/// Sums of `Columns` neighbours times `scale`.
+template <int Columns> PYXCC_INLINE wide::S16 scaledSums(wide::U8 x, int scale)
+{
+    const __m256i pairs = _mm256_maddubs_epi16(x.v, _mm256_set1_epi8(static_cast<char>(scale)));
+    if constexpr (Columns == 2) return wide::S16(pairs);
+    return wide::S16(_mm256_madd_epi16(pairs, _mm256_set1_epi16(1)));
 }
+
+template <int Columns> PYXCC_INLINE wide::S16 scaledSums(const Two<wide::U8>& rows, int scale)
+{
+    return scaledSums<Columns>(rows.a, scale) + scaledSums<Columns>(rows.b, scale);
+}
+
+} // namespace detail
+
+/// Sums over the bytes that share a chroma sample: `Columns` neighbours, 2 or 4, of one row or of two. Sums of fours
+/// stand in the even words, in order, and the odd words are zero. They are at hand 32 and 64 times as large too, since
+/// a sum costs the same at any scale; what a form does not use is never computed.
+template <int Columns, class Rows> struct Sums : wide::S16 {
+    static_assert(Columns == 2 || Columns == 4);
+    Rows bytes;
+
+    explicit PYXCC_INLINE Sums(const Rows& rows) : wide::S16(detail::scaledSums<Columns>(rows, 1)), bytes(rows) {}
+
+    friend PYXCC_INLINE wide::S16 operator<<(const Sums& x, int n)
+    {
+        if (n == 5 || n == 6) return detail::scaledSums<Columns>(x.bytes, 1 << n);
+        return static_cast<const wide::S16&>(x) << n;
+    }
+};
 
 /// Each word twice, in the order of widened bytes: what 16 chroma samples give is laid beside 32 luma samples.
 PYXCC_INLINE Two<wide::S16> doubled(wide::S16 x)
