@@ -11,32 +11,42 @@
 namespace forms
 {
 
+/// The bytes that a form makes, one after the other.
+inline std::array<u8, 1> bytesOf(pyxcc::scalar::Byte x) { return {x.v}; }
+inline std::array<u8, 2> bytesOf(const pyxcc::Two<pyxcc::scalar::Byte>& x) { return {x.a.v, x.b.v}; }
+inline std::array<u8, 3> bytesOf(const pyxcc::Three<pyxcc::scalar::Byte>& x) { return {x.a.v, x.b.v, x.c.v}; }
+
+/// What a register holds, a lane after the other.
+inline std::array<u8, 32> lanesOf(pyxcc::wide::U8 x)
+{
+    std::array<u8, 32> lanes;
+    pyxcc::layouts::storeSamples(lanes.data(), x);
+    return lanes;
+}
+inline std::array<std::array<u8, 32>, 1> outputsOf(pyxcc::wide::U8 x) { return {lanesOf(x)}; }
+inline std::array<std::array<u8, 32>, 3> outputsOf(const pyxcc::Three<pyxcc::wide::U8>& x)
+{
+    return {lanesOf(x.a), lanesOf(x.b), lanesOf(x.c)};
+}
+
 /// All 2^24 triples of bytes, 32 at a time.
 template <class Form> void expectInstancesAgree(const Form& form)
 {
-    using pyxcc::Three;
     using pyxcc::scalar::S16;
-    constexpr int block = pyxcc::wide::U8::count;
-    std::array<u8, block> a, b, c, x, y, z;
+    using pyxcc::wide::U8;
+    std::array<u8, U8::count> lanes;
     for (int first = 0; first < 256; ++first) {
         for (int second = 0; second < 256; ++second) {
-            for (int third = 0; third < 256; third += block) {
-                a.fill(static_cast<u8>(first));
-                b.fill(static_cast<u8>(second));
-                for (int i = 0; i < block; ++i) c[i] = static_cast<u8>(third + i);
-                const auto wide = pyxcc::frame::apply(form, Three{pyxcc::layouts::loadSamples(a.data()),
-                                                                  pyxcc::layouts::loadSamples(b.data()),
-                                                                  pyxcc::layouts::loadSamples(c.data())});
-                pyxcc::layouts::storeSamples(x.data(), wide.a);
-                pyxcc::layouts::storeSamples(y.data(), wide.b);
-                pyxcc::layouts::storeSamples(z.data(), wide.c);
-                for (int i = 0; i < block; ++i) {
-                    const auto one = form(S16(first), S16(second), S16(third + i));
-                    const bool same = x[i] == one.a.v && y[i] == one.b.v && z[i] == one.c.v;
-                    ASSERT_TRUE(same) << "of (" << first << ", " << second << ", " << third + i
-                                      << ") a register makes (" << int{x[i]} << ", " << int{y[i]} << ", " << int{z[i]}
-                                      << "), one value (" << int{one.a.v} << ", " << int{one.b.v} << ", "
-                                      << int{one.c.v} << ")";
+            for (int third = 0; third < 256; third += U8::count) {
+                for (int i = 0; i < U8::count; ++i) lanes[i] = static_cast<u8>(third + i);
+                const auto wide = outputsOf(pyxcc::frame::apply(
+                    form, pyxcc::Three{U8(first), U8(second), pyxcc::layouts::loadSamples(lanes.data())}));
+                for (int i = 0; i < U8::count; ++i) {
+                    const auto one = bytesOf(form(S16(first), S16(second), S16(third + i)));
+                    for (std::size_t k = 0; k < one.size(); ++k) {
+                        ASSERT_EQ(int{wide[k][i]}, int{one[k]}) << "output " << k << " of (" << first << ", " << second
+                                                                << ", " << third + i << "), register and one value";
+                    }
                 }
             }
         }
