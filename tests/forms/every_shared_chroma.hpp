@@ -1,0 +1,46 @@
+// Compares an inverse form over pixels that share their chroma with its scalar instance.
+#pragma once
+
+#include "every_input.hpp"
+#include "frame/shared_chroma_forms.hpp"
+
+namespace forms
+{
+
+/// All 2^24 triples, as pairs of rows: 16 values of Cb, each shared by two columns of both rows; Y in one row counts up
+/// as the blocks do, in the other it counts down.
+template <class Form> void expectSharedInstancesAgree(const Form& form)
+{
+    using pyxcc::layouts::loadForPairs;
+    using pyxcc::scalar::S16;
+    using pyxcc::wide::U8;
+    constexpr int pairs = U8::count / 2;
+    std::array<u8, pairs> cb, cr;
+
+    const auto expectRow = [&](const pyxcc::Three<U8>& row, int y) {
+        const auto wide = outputsOf(row);
+        for (int i = 0; i < U8::count; ++i) {
+            const auto one = bytesOf(form(S16(y), S16(cb[i / 2]), S16(cr[i / 2])));
+            for (std::size_t k = 0; k < one.size(); ++k) {
+                ASSERT_EQ(int{wide[k][i]}, int{one[k]}) << "output " << k << " in column " << i << " of (" << y << ", "
+                                                        << int{cb[i / 2]} << ", " << int{cr[i / 2]} << ")";
+            }
+        }
+    };
+
+    for (int y = 0; y < 256; ++y) {
+        for (int crOfAll = 0; crOfAll < 256; ++crOfAll) {
+            cr.fill(static_cast<u8>(crOfAll));
+            for (int firstCb = 0; firstCb < 256; firstCb += pairs) {
+                for (int i = 0; i < pairs; ++i) cb[i] = static_cast<u8>(firstCb + i);
+                const pyxcc::layouts::ChromaOfPairs<pyxcc::Two<U8>> pixels{
+                    {U8(y), U8(255 - y)}, {loadForPairs<2>(cb.data()), loadForPairs<2>(cr.data())}};
+                const auto rows = apply(form, pixels);
+                ASSERT_NO_FATAL_FAILURE(expectRow(rows.a, y));
+                ASSERT_NO_FATAL_FAILURE(expectRow(rows.b, 255 - y));
+            }
+        }
+    }
+}
+
+} // namespace forms
