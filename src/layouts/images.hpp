@@ -50,16 +50,17 @@ template <class Sample> auto c3(Sample* first, std::ptrdiff_t step)
     return detail::interleaved(first, step, C3<detail::RegisterOf<Sample>>{});
 }
 
-/// Four channels, of which the first three take part: a target keeps its fourth.
-template <class Sample> auto ac4(Sample* first, std::ptrdiff_t step)
+/// Four channels, of which the first three take part: a target keeps its fourth. Pixels may be loaded and stored in any
+/// order within a block where source and target are both so.
+template <Order order = Order::ofMemory, class Sample> auto ac4(Sample* first, std::ptrdiff_t step)
 {
-    return detail::interleaved(first, step, AC4<detail::RegisterOf<Sample>>{});
+    return detail::interleaved(first, step, AC4<detail::RegisterOf<Sample>, order>{});
 }
 
 /// Four channels, all of which take part.
-template <class Sample> auto c4(Sample* first, std::ptrdiff_t step)
+template <Order order = Order::ofMemory, class Sample> auto c4(Sample* first, std::ptrdiff_t step)
 {
-    return detail::interleaved(first, step, C4<detail::RegisterOf<Sample>>{});
+    return detail::interleaved(first, step, C4<detail::RegisterOf<Sample>, order>{});
 }
 
 /// A target whose fourth channel is set.

@@ -20,30 +20,35 @@ template <class Register> struct C3 {
 
     static PYXCC_INLINE Three<Samples> load(const u8* p) { return loadTriples<Samples>(p); }
     static PYXCC_INLINE void store(u8* p, const Three<Samples>& pixels) { storeTriples(p, pixels); }
+    static PYXCC_INLINE void stream(u8* p, const Three<Samples>& pixels) { storeTriples<Stores::streamed>(p, pixels); }
 };
 
 /// Four interleaved samples a pixel, the fourth not taking part: a store puts it back as it was.
-template <class Register> struct AC4 {
+template <class Register, Order order = Order::ofMemory> struct AC4 {
     using Samples = Register;
     static constexpr int pixelBytes = 4 * sampleBytes<Samples>;
     static constexpr bool readsTarget = true;
 
     static PYXCC_INLINE Three<Samples> load(const u8* p)
     {
-        const Four<Samples> pixels = loadQuadruples<Samples>(p);
+        const Four<Samples> pixels = loadQuadruples<Samples, order>(p);
         return {pixels.a, pixels.b, pixels.c};
     }
-    static PYXCC_INLINE void store(u8* p, const Three<Samples>& pixels) { storeTriplesOfQuadruples(p, pixels); }
+    static PYXCC_INLINE void store(u8* p, const Three<Samples>& pixels) { storeTriplesOfQuadruples<order>(p, pixels); }
 };
 
 /// Four interleaved samples a pixel, all of which take part.
-template <class Register> struct C4 {
+template <class Register, Order order = Order::ofMemory> struct C4 {
     using Samples = Register;
     static constexpr int pixelBytes = 4 * sampleBytes<Samples>;
     static constexpr bool readsTarget = false;
 
-    static PYXCC_INLINE Four<Samples> load(const u8* p) { return loadQuadruples<Samples>(p); }
-    static PYXCC_INLINE void store(u8* p, const Four<Samples>& pixels) { storeQuadruples(p, pixels); }
+    static PYXCC_INLINE Four<Samples> load(const u8* p) { return loadQuadruples<Samples, order>(p); }
+    static PYXCC_INLINE void store(u8* p, const Four<Samples>& pixels) { storeQuadruples<order>(p, pixels); }
+    static PYXCC_INLINE void stream(u8* p, const Four<Samples>& pixels)
+    {
+        storeQuadruples<order, Stores::streamed>(p, pixels);
+    }
 };
 
 /// Four interleaved samples a pixel, the fourth set.
@@ -138,7 +143,6 @@ template <class Packing, class Byte> struct InterleavedRow {
         copyBytes(pixel(x), buffer, count * pixelBytes);
     }
 
-private:
     PYXCC_INLINE Byte* pixel(int x) const { return at + static_cast<std::ptrdiff_t>(x) * pixelBytes; }
 };
 

@@ -8,6 +8,8 @@
 
 #include <algorithm>
 #include <cstring>
+#include <set>
+#include <string>
 #include <vector>
 
 namespace
@@ -32,6 +34,18 @@ struct InAC4 {
 struct InC4 {
     static constexpr int planes = 1, samples = 4, takingPart = 4;
     template <class Sample> static auto image(Sample* const* first) { return layouts::c4(first[0], 0); }
+};
+struct InAC4OfAnyOrder : InAC4 {
+    template <class Sample> static auto image(Sample* const* first)
+    {
+        return layouts::ac4<layouts::Order::any>(first[0], 0);
+    }
+};
+struct InC4OfAnyOrder : InC4 {
+    template <class Sample> static auto image(Sample* const* first)
+    {
+        return layouts::c4<layouts::Order::any>(first[0], 0);
+    }
 };
 struct InP3 {
     static constexpr int planes = 3, samples = 1, takingPart = 3;
@@ -162,6 +176,37 @@ template <class Sample, class Layout> struct BlocksOf {
     }
 };
 
+/// Pixels that come in any order keep their samples together, and are stored where they were loaded from.
+template <class Sample, class Layout> void expectPixelsKeptTogether()
+{
+    using Blocks = BlocksOf<Sample, Layout>;
+    support::Random numbers(4);
+    for (const Place& place : places) {
+        const Row<Sample, Layout> source(place, Blocks::block, numbers), target(place, Blocks::block, numbers);
+        const auto pixels = source.template row<const Sample>().load(0);
+        const auto channels = Blocks::bytesOf(pixels);
+        std::multiset<std::string> told, loaded;
+        for (int i = 0; i < Blocks::block; ++i) {
+            std::string sourcePixel, pixel;
+            for (int c = 0; c < Layout::takingPart; ++c) {
+                sourcePixel.append(reinterpret_cast<const char*>(source.sample(i, c)), sizeof(Sample));
+                pixel.append(reinterpret_cast<const char*>(&channels[c][i * sizeof(Sample)]), sizeof(Sample));
+            }
+            told.insert(sourcePixel);
+            loaded.insert(pixel);
+        }
+        EXPECT_EQ(loaded, told) << nameOf(place.placement);
+
+        target.template row<Sample>().store(0, pixels);
+        for (int i = 0; i < Blocks::block; ++i) {
+            for (int c = 0; c < Layout::takingPart; ++c) {
+                EXPECT_EQ(std::memcmp(target.sample(i, c), source.sample(i, c), sizeof(Sample)), 0)
+                    << "channel " << c << " of pixel " << i << ", " << nameOf(place.placement);
+            }
+        }
+    }
+}
+
 template <class Sample> class Rows : public testing::Test
 {
 };
@@ -182,6 +227,8 @@ TYPED_TEST(Rows, AC4Loads) { BlocksOf<TypeParam, InAC4>::expectLoads(); }
 TYPED_TEST(Rows, AC4StoresKeepTheFourth) { BlocksOf<TypeParam, InAC4>::expectStores(); }
 TYPED_TEST(Rows, C4Loads) { BlocksOf<TypeParam, InC4>::expectLoads(); }
 TYPED_TEST(Rows, C4Stores) { BlocksOf<TypeParam, InC4>::expectStores(); }
+TYPED_TEST(Rows, AC4OfAnyOrder) { expectPixelsKeptTogether<TypeParam, InAC4OfAnyOrder>(); }
+TYPED_TEST(Rows, C4OfAnyOrder) { expectPixelsKeptTogether<TypeParam, InC4OfAnyOrder>(); }
 TYPED_TEST(Rows, P3Loads) { BlocksOf<TypeParam, InP3>::expectLoads(); }
 TYPED_TEST(Rows, P3Stores) { BlocksOf<TypeParam, InP3>::expectStores(); }
 

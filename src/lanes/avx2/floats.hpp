@@ -74,12 +74,22 @@ PYXCC_INLINE Four<F32> toF32(U8 x)
     const Two<F32> high = toF32(U16(_mm256_unpackhi_epi8(x.v, zero)));
     return {low.a, low.b, high.a, high.b};
 }
+
+/// What zero-extended signed bytes are to differ by, bit by bit, to be floats 2^23 + 128 greater than they.
+inline constexpr int offsetByte = 0x4b000080;
+
+/// Takes the 2^23 + 128 away: no more work than a conversion, which would need the sign extended in front of it. Exact;
+/// a zero becomes -0 where the mode is to round down.
+PYXCC_INLINE F32 lessOffset(S32 x) { return F32(_mm256_castsi256_ps(x.v)) - F32(0x1p23f + 128); }
+
 PYXCC_INLINE Four<F32> toF32(S8 x)
 {
-    const __m256i signs = _mm256_cmpgt_epi8(_mm256_setzero_si256(), x.v);
-    const Two<F32> low = toF32(S16(_mm256_unpacklo_epi8(x.v, signs)));
-    const Two<F32> high = toF32(S16(_mm256_unpackhi_epi8(x.v, signs)));
-    return {low.a, low.b, high.a, high.b};
+    const __m256i zero = _mm256_setzero_si256(), exponent = _mm256_set1_epi16(offsetByte >> 16);
+    const __m256i offset = _mm256_xor_si256(x.v, _mm256_set1_epi8(static_cast<char>(offsetByte)));
+    const __m256i low = _mm256_unpacklo_epi8(offset, zero), high = _mm256_unpackhi_epi8(offset, zero);
+    return {
+        lessOffset(S32(_mm256_unpacklo_epi16(low, exponent))), lessOffset(S32(_mm256_unpackhi_epi16(low, exponent))),
+        lessOffset(S32(_mm256_unpacklo_epi16(high, exponent))), lessOffset(S32(_mm256_unpackhi_epi16(high, exponent)))};
 }
 
 /// Integers narrowed to samples, clamped at both ends.

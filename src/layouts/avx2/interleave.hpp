@@ -11,11 +11,27 @@ namespace pyxcc::layouts
 
 template <class Samples> inline constexpr int sampleBytes = 32 / Samples::count;
 
+/// The order of a block's pixels in a register: that of memory, or whatever is the least work for pixels of four
+/// samples, which never need to cross the halves of a register. The stores take either back.
+enum class Order { ofMemory, any };
+
+/// Stores go to the cache, or past it at addresses that are multiples of 32.
+enum class Stores { cached, streamed };
+
 namespace detail
 {
 
 PYXCC_INLINE __m256i loadWhole(const u8* p) { return _mm256_loadu_si256(reinterpret_cast<const __m256i*>(p)); }
 PYXCC_INLINE void storeWhole(u8* p, __m256i v) { _mm256_storeu_si256(reinterpret_cast<__m256i*>(p), v); }
+
+template <Stores stores> PYXCC_INLINE void put(u8* p, __m256i v)
+{
+    if constexpr (stores == Stores::streamed) {
+        _mm256_stream_si256(reinterpret_cast<__m256i*>(p), v);
+    } else {
+        storeWhole(p, v);
+    }
+}
 
 template <class Samples> PYXCC_INLINE Samples as(__m256i v) { return Samples(v); }
 template <> PYXCC_INLINE wide::F32 as<wide::F32>(__m256i v) { return wide::F32(_mm256_castsi256_ps(v)); }
@@ -50,12 +66,15 @@ template <int Bytes> struct Thirds {
     static constexpr int inverseOf3 = samples == 16 ? 11 : 3; // modulo `samples`
 
     /// Place 3 i + c to place i.
-    template <int C> static constexpr Places gather = placesOfBytes<Bytes>([](int i) { return (3 * i + C) % samples; });
+    template <int C> static PYXCC_INLINE __m256i gather(__m256i x)
+    {
+        return rearrange([](int i) { return (3 * i + C) % samples; }, x);
+    }
     /// Place i to place 3 i + c.
-    template <int C>
-    static constexpr Places spread = placesOfBytes<Bytes>([](int i) {
-        return inverseOf3 * (i - C + samples) % samples;
-    });
+    template <int C> static PYXCC_INLINE __m256i spread(__m256i x)
+    {
+        return rearrange([](int i) { return inverseOf3 * (i - C + samples) % samples; }, x);
+    }
 
     /// The bytes of the samples at `start` and every third place behind it.
     static constexpr Places mask(int start)
@@ -75,6 +94,18 @@ template <int Bytes> struct Thirds {
             return _mm256_blend_epi16(_mm256_blend_epi16(x, y, 0x92), z, 0x24);
         } else {
             return _mm256_blendv_epi8(_mm256_blendv_epi8(x, y, inBothLanes(second)), z, inBothLanes(last));
+        }
+    }
+
+private:
+    /// Brings place placeOf(i) to place i.
+    template <class PlaceOf> static PYXCC_INLINE __m256i rearrange(PlaceOf placeOf, __m256i x)
+    {
+        if constexpr (Bytes == 4) {
+            constexpr int places = placeOf(0) | placeOf(1) << 2 | placeOf(2) << 4 | placeOf(3) << 6;
+            return _mm256_shuffle_epi32(x, places);
+        } else {
+            return shuffle(x, placesOfBytes<Bytes>(placeOf));
         }
     }
 };
@@ -109,29 +140,30 @@ template <class Samples> PYXCC_INLINE Three<Samples> loadTriples(const u8* p)
     // A lane ends within a pixel, after its first sample or its second: two lanes change their parts.
     constexpr bool afterFirst = Thirds::samples % 3 == 1;
     const __m256i y = afterFirst ? middle : end, z = afterFirst ? end : middle;
-    return {detail::as<Samples>(detail::shuffle(Thirds::blend(x, z, y), Thirds::template gather<0>)),
-            detail::as<Samples>(detail::shuffle(Thirds::blend(y, x, z), Thirds::template gather<1>)),
-            detail::as<Samples>(detail::shuffle(Thirds::blend(z, y, x), Thirds::template gather<2>))};
+    return {detail::as<Samples>(Thirds::template gather<0>(Thirds::blend(x, z, y))),
+            detail::as<Samples>(Thirds::template gather<1>(Thirds::blend(y, x, z))),
+            detail::as<Samples>(Thirds::template gather<2>(Thirds::blend(z, y, x)))};
 }
 
 /// Writes a block of pixels of three samples, 96 bytes.
-template <class Samples> PYXCC_INLINE void storeTriples(u8* p, const Three<Samples>& pixels)
+template <Stores stores = Stores::cached, class Samples>
+PYXCC_INLINE void storeTriples(u8* p, const Three<Samples>& pixels)
 {
     using Thirds = detail::Thirds<sampleBytes<Samples>>;
-    const __m256i a = detail::shuffle(detail::raw(pixels.a), Thirds::template spread<0>);
-    const __m256i b = detail::shuffle(detail::raw(pixels.b), Thirds::template spread<1>);
-    const __m256i c = detail::shuffle(detail::raw(pixels.c), Thirds::template spread<2>);
+    const __m256i a = Thirds::template spread<0>(detail::raw(pixels.a));
+    const __m256i b = Thirds::template spread<1>(detail::raw(pixels.b));
+    const __m256i c = Thirds::template spread<2>(detail::raw(pixels.c));
     constexpr bool afterFirst = Thirds::samples % 3 == 1;
     const __m256i x = Thirds::blend(a, b, c);
     const __m256i y = afterFirst ? Thirds::blend(b, c, a) : Thirds::blend(c, a, b);
     const __m256i z = afterFirst ? Thirds::blend(c, a, b) : Thirds::blend(b, c, a);
-    detail::storeWhole(p, _mm256_permute2x128_si256(x, y, 0x20));
-    detail::storeWhole(p + 32, _mm256_blend_epi32(z, x, 0xf0));
-    detail::storeWhole(p + 64, _mm256_permute2x128_si256(y, z, 0x31));
+    detail::put<stores>(p, _mm256_permute2x128_si256(x, y, 0x20));
+    detail::put<stores>(p + 32, _mm256_blend_epi32(z, x, 0xf0));
+    detail::put<stores>(p + 64, _mm256_permute2x128_si256(y, z, 0x31));
 }
 
 /// Reads a block of pixels of four samples, 128 bytes.
-template <class Samples> PYXCC_INLINE Four<Samples> loadQuadruples(const u8* p)
+template <class Samples, Order order = Order::ofMemory> PYXCC_INLINE Four<Samples> loadQuadruples(const u8* p)
 {
     // Four bytes of a channel side by side, then eight, then sixteen; the lanes come out interleaved by fours.
     const auto fours = [p](int at) PYXCC_INLINE_LAMBDA {
@@ -149,7 +181,7 @@ template <class Samples> PYXCC_INLINE Four<Samples> loadQuadruples(const u8* p)
     const __m256i cd0 = _mm256_unpackhi_epi32(x0, x1), cd1 = _mm256_unpackhi_epi32(x2, x3);
     const __m256i inOrder = _mm256_setr_epi32(0, 4, 1, 5, 2, 6, 3, 7);
     const auto channel = [&](__m256i lanes) PYXCC_INLINE_LAMBDA {
-        return detail::as<Samples>(_mm256_permutevar8x32_epi32(lanes, inOrder));
+        return detail::as<Samples>(order == Order::any ? lanes : _mm256_permutevar8x32_epi32(lanes, inOrder));
     };
     return {channel(_mm256_unpacklo_epi64(ab0, ab1)), channel(_mm256_unpackhi_epi64(ab0, ab1)),
             channel(_mm256_unpacklo_epi64(cd0, cd1)), channel(_mm256_unpackhi_epi64(cd0, cd1))};
@@ -159,7 +191,7 @@ namespace detail
 {
 
 /// The four registers of interleaved pixels, in the order of memory.
-template <class Samples> PYXCC_INLINE Four<wide::U8> interleave(const Four<Samples>& pixels)
+template <Order order, class Samples> PYXCC_INLINE Four<wide::U8> interleave(const Four<Samples>& pixels)
 {
     constexpr int bytes = sampleBytes<Samples>;
     const __m256i a = raw(pixels.a), b = raw(pixels.b), c = raw(pixels.c), d = raw(pixels.d);
@@ -167,6 +199,7 @@ template <class Samples> PYXCC_INLINE Four<wide::U8> interleave(const Four<Sampl
     const __m256i cd0 = unpackLow<bytes>(c, d), cd1 = unpackHigh<bytes>(c, d);
     const __m256i x0 = unpackLow<2 * bytes>(ab0, cd0), x1 = unpackHigh<2 * bytes>(ab0, cd0);
     const __m256i x2 = unpackLow<2 * bytes>(ab1, cd1), x3 = unpackHigh<2 * bytes>(ab1, cd1);
+    if constexpr (order == Order::any) return {wide::U8(x0), wide::U8(x1), wide::U8(x2), wide::U8(x3)};
     return {wide::U8(_mm256_permute2x128_si256(x0, x1, 0x20)), wide::U8(_mm256_permute2x128_si256(x2, x3, 0x20)),
             wide::U8(_mm256_permute2x128_si256(x0, x1, 0x31)), wide::U8(_mm256_permute2x128_si256(x2, x3, 0x31))};
 }
@@ -174,13 +207,14 @@ template <class Samples> PYXCC_INLINE Four<wide::U8> interleave(const Four<Sampl
 } // namespace detail
 
 /// Writes a block of pixels of four samples, 128 bytes.
-template <class Samples> PYXCC_INLINE void storeQuadruples(u8* p, const Four<Samples>& pixels)
+template <Order order = Order::ofMemory, Stores stores = Stores::cached, class Samples>
+PYXCC_INLINE void storeQuadruples(u8* p, const Four<Samples>& pixels)
 {
-    const Four<wide::U8> x = detail::interleave(pixels);
-    detail::storeWhole(p, x.a.v);
-    detail::storeWhole(p + 32, x.b.v);
-    detail::storeWhole(p + 64, x.c.v);
-    detail::storeWhole(p + 96, x.d.v);
+    const Four<wide::U8> x = detail::interleave<order>(pixels);
+    detail::put<stores>(p, x.a.v);
+    detail::put<stores>(p + 32, x.b.v);
+    detail::put<stores>(p + 64, x.c.v);
+    detail::put<stores>(p + 96, x.d.v);
 }
 
 /// Writes 32 bytes of pixels of four samples; each fourth sample is put back as it was.
@@ -199,10 +233,11 @@ template <class Samples> PYXCC_INLINE void storeButFourths(u8* p, Samples sample
 }
 
 /// Writes the first three samples of a block of pixels of four; each fourth sample is put back as it was.
-template <class Samples> PYXCC_INLINE void storeTriplesOfQuadruples(u8* p, const Three<Samples>& pixels)
+template <Order order = Order::ofMemory, class Samples>
+PYXCC_INLINE void storeTriplesOfQuadruples(u8* p, const Three<Samples>& pixels)
 {
-    const Four<wide::U8> x =
-        detail::interleave(Four<Samples>{pixels.a, pixels.b, pixels.c, detail::as<Samples>(_mm256_setzero_si256())});
+    const Four<wide::U8> x = detail::interleave<order>(
+        Four<Samples>{pixels.a, pixels.b, pixels.c, detail::as<Samples>(_mm256_setzero_si256())});
     storeButFourths(p, detail::as<Samples>(x.a.v));
     storeButFourths(p + 32, detail::as<Samples>(x.b.v));
     storeButFourths(p + 64, detail::as<Samples>(x.c.v));

@@ -1,0 +1,98 @@
+// Eight interleaved pixels of bytes as a register of floats a channel, and back: less work than widening all the bytes
+// of a register, and fewer registers at a time.
+#pragma once
+
+#include "layouts/avx2/interleave.hpp"
+
+#include <type_traits>
+
+namespace pyxcc::layouts
+{
+
+namespace detail
+{
+
+/// Bytes that were zero-extended to double words, as floats.
+template <class Byte> PYXCC_INLINE wide::F32 floatsOfBytes(__m256i x)
+{
+    if constexpr (std::is_signed_v<Byte>) {
+        return wide::lessOffset(wide::S32(_mm256_xor_si256(x, _mm256_set1_epi32(wide::offsetByte))));
+    } else {
+        return toF32(wide::S32(x));
+    }
+}
+
+/// The sources of a shuffle that brings bytes to double words and clears the rest: at(i) is that of double word i.
+template <class At> constexpr std::array<u8, 32> zeroExtending(At at)
+{
+    std::array<u8, 32> places{};
+    for (int i = 0; i < 32; ++i) places[i] = i % 4 == 0 ? static_cast<u8>(at(i / 4)) : 0x80;
+    return places;
+}
+
+/// In each half, the four pixels' bytes of the first channel, of the third, and of the second twice; saturated.
+template <class Byte> PYXCC_INLINE __m256i foursOfChannels(const Three<wide::S32>& x)
+{
+    const __m256i ac = _mm256_packs_epi32(x.a.v, x.c.v), bb = _mm256_packs_epi32(x.b.v, x.b.v);
+    return std::is_signed_v<Byte> ? _mm256_packs_epi16(ac, bb) : _mm256_packus_epi16(ac, bb);
+}
+
+/// The sources of a shuffle that brings those to pixels of `bytes` bytes each; what is left is cleared.
+constexpr Places byPixels(int bytes)
+{
+    constexpr int first[] = {0, 8, 4};
+    Places places{};
+    for (int i = 0; i < 16; ++i) {
+        const int pixel = i / bytes, channel = i % bytes;
+        places[i] = pixel < 4 && channel < 3 ? static_cast<u8>(first[channel] + pixel) : 0x80;
+    }
+    return places;
+}
+
+} // namespace detail
+
+/// Reads 8 pixels of three bytes.
+template <class Byte> PYXCC_INLINE Three<wide::F32> loadEightTriples(const u8* p)
+{
+    // The upper half of the register ends where the pixels end.
+    const __m128i low = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p));
+    const __m128i high = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + 8));
+    const __m256i x = _mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1);
+    const auto channel = [x]<int C>(std::integral_constant<int, C>) PYXCC_INLINE_LAMBDA {
+        static constexpr auto places = detail::zeroExtending([](int i) { return 3 * i + C - (i < 4 ? 0 : 8); });
+        return detail::floatsOfBytes<Byte>(_mm256_shuffle_epi8(x, detail::loadWhole(places.data())));
+    };
+    return {channel(std::integral_constant<int, 0>{}), channel(std::integral_constant<int, 1>{}),
+            channel(std::integral_constant<int, 2>{})};
+}
+
+/// Writes 8 pixels of three bytes, saturated.
+template <class Byte> PYXCC_INLINE void storeEightTriples(u8* p, const Three<wide::S32>& pixels)
+{
+    const __m256i twelves = detail::shuffle(detail::foursOfChannels<Byte>(pixels), detail::byPixels(3));
+    const __m256i x = _mm256_permutevar8x32_epi32(twelves, _mm256_setr_epi32(0, 1, 2, 4, 5, 6, 7, 7));
+    _mm_storeu_si128(reinterpret_cast<__m128i*>(p), _mm256_castsi256_si128(x));
+    _mm_storel_epi64(reinterpret_cast<__m128i*>(p + 16), _mm256_extracti128_si256(x, 1));
+}
+
+/// Reads the first three bytes of 8 pixels of four.
+template <class Byte> PYXCC_INLINE Three<wide::F32> loadEightQuadruples(const u8* p)
+{
+    const __m256i x = detail::loadWhole(p);
+    const auto channel = [x]<int C>(std::integral_constant<int, C>) PYXCC_INLINE_LAMBDA {
+        static constexpr auto places = detail::zeroExtending([](int i) { return i % 4 * 4 + C; });
+        return detail::floatsOfBytes<Byte>(_mm256_shuffle_epi8(x, detail::loadWhole(places.data())));
+    };
+    return {detail::floatsOfBytes<Byte>(_mm256_and_si256(x, _mm256_set1_epi32(0xff))),
+            channel(std::integral_constant<int, 1>{}), channel(std::integral_constant<int, 2>{})};
+}
+
+/// Writes the first three bytes of 8 pixels of four, saturated; each fourth byte is put back as it was.
+template <class Byte> PYXCC_INLINE void storeEightQuadruples(u8* p, const Three<wide::S32>& pixels)
+{
+    const __m256i x = detail::shuffle(detail::foursOfChannels<Byte>(pixels), detail::byPixels(4));
+    const __m256i fourths = _mm256_set1_epi32(static_cast<int>(0xff000000u));
+    detail::storeWhole(p, _mm256_or_si256(x, _mm256_and_si256(detail::loadWhole(p), fourths)));
+}
+
+} // namespace pyxcc::layouts
