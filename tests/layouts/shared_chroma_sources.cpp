@@ -1,6 +1,6 @@
 // Sources with shared chroma against the plain statement of each layout: where luma and chroma of pixel x of a row lie.
-#include "layouts/shared_chroma.hpp"
 #include "frame/shared_chroma_forms.hpp"
+#include "layouts/shared_chroma.hpp"
 #include "support/memory.hpp"
 #include "support/random.hpp"
 
