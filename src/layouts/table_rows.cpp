@@ -57,8 +57,9 @@ PYXCC_INLINE void lookUpEight(const u16* table, const u8* from, u8* to)
 PYXCC_INLINE void lookUpPixel(const u16* table, const u8* from, u8* to)
 {
     const Four pixel = loadFour(from);
-    const u16 found[] = {at<0>(table, pixel), at<1>(table, pixel), at<2>(table, pixel)};
-    store(to, found);
+    store(to, at<0>(table, pixel));
+    store(to + 2, at<1>(table, pixel));
+    store(to + 4, at<2>(table, pixel));
 }
 
 } // namespace

@@ -17,24 +17,30 @@
 namespace pyxcc::tone
 {
 
-inline constexpr double ln2 = std::numbers::ln2;
-
 /// How to approximate x^p for x = 2^e (1 + m): the power of 2^e by exp2, that of 1 + m by a polynomial of its own.
 struct CoarsePower {
-    float exponent;
+    float p;
     float mantissa[4];
+    float excess; ///< of the exponent meant over p, in the unit of coarse(): times 2^-20 log 2
 };
 
+inline constexpr float excessUnit = 0x1p-20f * std::numbers::ln2_v<float>;
+
+inline constexpr CoarsePower near045 = {
+    -0.05f, {0.99997586f, -0.04910313f, 0.02082935f, -0.00578907f}, 0x1p-53f * 0.1f * excessUnit};
+inline constexpr CoarsePower near222 = {
+    0.22222222f, {1.00006301f, 0.21980145f, -0.07162767f, 0.01836575f}, 0x1p-53f * 8 / 9 * excessUnit};
+
 template <class F64> struct Coarse {
-    F64 power; ///< 13 bits, off by less than 1 / 6000
-    F64 log2;  ///< off by less than 0.09
+    F64 power;  ///< 13 bits, off by less than 1 / 6000
+    F64 excess; ///< excess * log x, where log2 x is off by less than 0.09
 };
 
 /// For x from 2^-60 to 2^400.
 template <class F64> PYXCC_INLINE Coarse<F64> coarse(const F64& x, const CoarsePower& k)
 {
     const auto bits = upperWords(x) - (1023 << 20);
-    const auto power = toF32(bits >> 20) * k.exponent;
+    const auto power = toF32(bits >> 20) * k.p;
     const auto whole = roundedToEven(power);
     const auto t = power - whole;
     const auto t2 = t * t;
@@ -42,7 +48,7 @@ template <class F64> PYXCC_INLINE Coarse<F64> coarse(const F64& x, const CoarseP
         fused(t2, fused(t2, 0.009570679f, fused(t, 0.055921273f, 0.24026212f)), fused(t, 0.69316411f, 1.0000603f));
     const auto m = toF32(bits & 0xfffff) * 0x1p-20f;
     const auto mantissa = fused(m * m, fused(m, k.mantissa[3], k.mantissa[2]), fused(m, k.mantissa[1], k.mantissa[0]));
-    return {toF64(withoutLowBits(timesPowerOf2(exp2 * mantissa, whole), 11)), toF64(toF32(bits)) * 0x1p-20};
+    return {toF64(withoutLowBits(timesPowerOf2(exp2 * mantissa, whole), 11)), toF64(toF32(bits) * k.excess)};
 }
 
 /// The result, but x itself where that is infinity or NaN.
@@ -61,12 +67,11 @@ template <class F64> PYXCC_INLINE F64 correction(const F64& e, const double (&k)
 /// x^0.45, where 0.45 is 9/20 and a tenth of 2^-53, for x from 0.018 up, infinity and NaN included.
 template <class F64> PYXCC_INLINE F64 power045(const F64& x)
 {
-    const auto near = coarse(x, {-0.05f, {0.99997586f, -0.04910313f, 0.02082935f, -0.00578907f}});
+    const auto near = coarse(x, near045);
     const F64 z = near.power, z2 = z * z, z4 = z2 * z2, z8 = z4 * z4;
     const F64 e = fused(z8 * z8 * z4, x, -1.0);
-    const F64 c =
-        correction(e, {-0.05, 0.02624999999794327, -0.0179374999968003, 0.013677653413640382, -0.011078969603955506},
-                   near.log2 * (0x1p-53 * 0.1 * ln2));
+    const F64 c = correction(
+        e, {-0.05, 0.02624999999794327, -0.0179374999968003, 0.013677653413640382, -0.011078969603955506}, near.excess);
     // x^0.45 is the square root by x^(-1/20). The exact root is s + (x - s^2) / 2 s, and 1 / s is near to z^10.
     const F64 s = sqrt(x), rest = fused(-s, s, x), ofRest = z8 * z2 * (z * 0.5);
     const F64 y = s * z, below = fused(s, z, -y);
@@ -76,14 +81,14 @@ template <class F64> PYXCC_INLINE F64 power045(const F64& x)
 /// w^2.2222222222222223, whose exponent is 20/9 and 8/9 of 2^-53, for w from 0.16 up, infinity and NaN included.
 template <class F64> PYXCC_INLINE F64 power222(const F64& w)
 {
-    const auto near = coarse(w, {0.22222222f, {1.00006301f, 0.21980145f, -0.07162767f, 0.01836575f}});
+    const auto near = coarse(w, near222);
     const F64 z = near.power, z2 = z * z, z4 = z2 * z2, z9 = z4 * z4 * z;
     // z is near to w^(2/9), and z^9 to w^2 = square + rest.
     const F64 square = w * w, rest = fused(w, w, -square);
     const F64 e = (square - z9 + rest) / z9;
     const F64 c = correction(
         e, {0.1111111111111111, -0.04938271604912385, 0.031092821215886007, -0.02245606215528491, 0.01746585757377671},
-        near.log2 * (0x1p-53 * 8 / 9 * ln2));
+        near.excess);
     const F64 y = square * z, below = fused(square, z, -y);
     return finiteOr(w, y + fused(y, c, fused(rest, z, below)));
 }
