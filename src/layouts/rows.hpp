@@ -118,7 +118,11 @@ template <class Packing, class Byte> struct InterleavedRow {
     Byte* at;
     Packing packing;
 
-    PYXCC_INLINE auto load(int x) const { return packing.load(pixel(x)); }
+    PYXCC_INLINE auto load(int x) const
+    {
+        expectFrom<4096>(pixel(x));
+        return packing.load(pixel(x));
+    }
 
     PYXCC_INLINE auto load(int x, int count) const
     {
@@ -132,6 +136,7 @@ template <class Packing, class Byte> struct InterleavedRow {
 
     template <class Pixels> PYXCC_INLINE void store(int x, const Pixels& pixels) const
     {
+        expectFrom<2048>(pixel(x));
         packing.store(pixel(x), pixels);
     }
 
