@@ -32,8 +32,9 @@ template <int Columns, class Luma> using ChromaOfSums = SharedChroma<Columns, Lu
 template <class Luma> using ChromaOfPairs = SharedChroma<2, Luma, wide::Sample>;
 
 /// Rows of two planes of chroma.
-template <int Columns, class Byte> struct ChromaPlanesRow {
+template <int Columns, class Byte, Order Within = Order::ofMemory> struct ChromaPlanesRow {
     static constexpr int columns = Columns;
+    static constexpr Order order = Within;
     Byte *a, *b;
 
     PYXCC_INLINE Two<wide::Sample> load(int x) const
@@ -48,13 +49,13 @@ template <int Columns, class Byte> struct ChromaPlanesRow {
 
     PYXCC_INLINE void store(int x, const Two<wide::Byte>& chroma) const
     {
-        storeApart<Columns>(a + x / Columns, b + x / Columns, chroma);
+        storeApart<Columns, order>(a + x / Columns, b + x / Columns, chroma);
     }
 
     PYXCC_INLINE void store(int x, int count, const Two<wide::Byte>& chroma) const
     {
         u8 bufferA[wide::U8::count / Columns], bufferB[wide::U8::count / Columns];
-        storeApart<Columns>(bufferA, bufferB, chroma);
+        storeApart<Columns, order>(bufferA, bufferB, chroma);
         copyBytes(a + x / Columns, bufferA, count / Columns);
         copyBytes(b + x / Columns, bufferB, count / Columns);
     }
@@ -77,18 +78,22 @@ private:
 template <class T> PYXCC_INLINE Two<T> exchanged(const Two<T>& x) { return {x.b, x.a}; }
 
 /// A row of one plane of chroma pairs, the second component first if `Exchanged`.
-template <class Byte, bool Exchanged> struct ChromaPairsRow {
+template <class Byte, bool Exchanged, Order Within = Order::ofMemory> struct ChromaPairsRow {
     static constexpr int columns = 2;
+    static constexpr Order order = Within;
     SampleRow<wide::U8, Byte> pairs;
 
     PYXCC_INLINE Two<wide::Sample> load(int x) const { return apart(pairs.load(x)); }
     PYXCC_INLINE Two<wide::Sample> load(int x, int count) const { return apart(pairs.load(x, count + (count & 1))); }
 
-    PYXCC_INLINE void store(int x, const Two<wide::Byte>& chroma) const { pairs.store(x, narrowInTurn(chroma)); }
+    PYXCC_INLINE void store(int x, const Two<wide::Byte>& chroma) const
+    {
+        pairs.store(x, inMemoryOrder<order>(narrowInTurn(chroma)));
+    }
 
     PYXCC_INLINE void store(int x, int count, const Two<wide::Byte>& chroma) const
     {
-        pairs.store(x, count & ~1, narrowInTurn(chroma));
+        pairs.store(x, count & ~1, inMemoryOrder<order>(narrowInTurn(chroma)));
     }
 
 private:
@@ -120,7 +125,7 @@ template <class LumaRow, class ChromaRow> struct SharedChromaRow {
     template <int Columns, class Luma> PYXCC_INLINE void store(int x, const ChromaOfSums<Columns, Luma>& pixels) const
     {
         static_assert(Columns == ChromaRow::columns);
-        luma.store(x, pixels.luma);
+        luma.store(x, ordered(pixels.luma));
         chroma.store(x, pixels.chroma);
     }
 
@@ -128,30 +133,34 @@ template <class LumaRow, class ChromaRow> struct SharedChromaRow {
     PYXCC_INLINE void store(int x, int count, const ChromaOfSums<Columns, Luma>& pixels) const
     {
         static_assert(Columns == ChromaRow::columns);
-        luma.store(x, count, pixels.luma);
+        luma.store(x, count, ordered(pixels.luma));
         chroma.store(x, count, pixels.chroma);
     }
+
+private:
+    static PYXCC_INLINE wide::U8 ordered(wide::U8 row) { return inMemoryOrder<ChromaRow::order>(row); }
+    static PYXCC_INLINE Two<wide::U8> ordered(const Two<wide::U8>& rows) { return {ordered(rows.a), ordered(rows.b)}; }
 };
 
 template <class LumaRow, class ChromaRow> SharedChromaRow(LumaRow, ChromaRow) -> SharedChromaRow<LumaRow, ChromaRow>;
 
 /// Two planes of chroma, a sample for every `Columns` columns.
-template <int Columns, class Byte> struct ChromaPlanes {
+template <int Columns, class Byte, Order order = Order::ofMemory> struct ChromaPlanes {
     std::array<Byte*, 2> first;
     std::array<std::ptrdiff_t, 2> step;
 
     PYXCC_INLINE auto row(int y) const
     {
-        return ChromaPlanesRow<Columns, Byte>{rowAt(first[0], step[0], y), rowAt(first[1], step[1], y)};
+        return ChromaPlanesRow<Columns, Byte, order>{rowAt(first[0], step[0], y), rowAt(first[1], step[1], y)};
     }
 };
 
 /// A plane of chroma pairs, one for every two columns.
-template <class Byte, bool Exchanged> struct PairedChroma {
+template <class Byte, bool Exchanged, Order order = Order::ofMemory> struct PairedChroma {
     Byte* first;
     std::ptrdiff_t step;
 
-    PYXCC_INLINE auto row(int y) const { return ChromaPairsRow<Byte, Exchanged>{{rowAt(first, step, y)}}; }
+    PYXCC_INLINE auto row(int y) const { return ChromaPairsRow<Byte, Exchanged, order>{{rowAt(first, step, y)}}; }
 };
 
 /// A plane of luma, and chroma in planes of its own.
@@ -173,7 +182,7 @@ private:
 };
 
 /// Luma and chroma bytes in turn, luma first.
-struct LumaFirst {
+template <Order order> struct LumaFirst {
     using Samples = wide::U8;
     static constexpr int pixelBytes = 2;
     static constexpr bool readsTarget = false;
@@ -186,7 +195,7 @@ struct LumaFirst {
 
     static PYXCC_INLINE void store(u8* p, const ChromaOfSums<2, wide::U8>& pixels)
     {
-        storeAlternating(p, pixels.luma, narrowInTurn(pixels.chroma));
+        storeAlternating<order>(p, pixels.luma, narrowInTurn(pixels.chroma));
     }
 
     /// A last odd pixel has one chroma sample of its own; the other one is that of the pair before, right in front of
@@ -195,7 +204,7 @@ struct LumaFirst {
 };
 
 /// Chroma and luma bytes in turn, chroma first.
-struct ChromaFirst {
+template <Order order> struct ChromaFirst {
     using Samples = wide::U8;
     static constexpr int pixelBytes = 2;
     static constexpr bool readsTarget = false;
@@ -208,7 +217,7 @@ struct ChromaFirst {
 
     static PYXCC_INLINE void store(u8* p, const ChromaOfSums<2, wide::U8>& pixels)
     {
-        storeAlternating(p, narrowInTurn(pixels.chroma), pixels.luma);
+        storeAlternating<order>(p, narrowInTurn(pixels.chroma), pixels.luma);
     }
 
     /// A last odd pixel has one chroma sample of its own; the other one is that of the pair before. In a row of one
@@ -234,44 +243,47 @@ template <class Packing> struct ChromaExchanged : Packing {
     }
 };
 
+// Targets with an order other than that of memory are for sources that load pixels in it.
+
 /// Three planes with a step each: luma, and two of chroma with a sample for every `Columns` columns.
-template <int Columns, class Byte> auto p3(Byte* const planes[3], const int steps[3])
+template <int Columns, Order order = Order::ofMemory, class Byte> auto p3(Byte* const planes[3], const int steps[3])
 {
-    using Chroma = ChromaPlanes<Columns, Byte>;
+    using Chroma = ChromaPlanes<Columns, Byte, order>;
     return SharedChromaImage<Chroma, Byte>{planes[0], steps[0], Chroma{{planes[1], planes[2]}, {steps[1], steps[2]}}};
 }
 
 /// A plane of luma and one of chroma pairs.
-template <class Byte> auto p2(Byte* luma, int lumaStep, Byte* pairs, int pairsStep)
+template <Order order = Order::ofMemory, class Byte> auto p2(Byte* luma, int lumaStep, Byte* pairs, int pairsStep)
 {
-    return SharedChromaImage<PairedChroma<Byte, false>, Byte>{luma, lumaStep, {pairs, pairsStep}};
+    return SharedChromaImage<PairedChroma<Byte, false, order>, Byte>{luma, lumaStep, {pairs, pairsStep}};
 }
 
 /// Packed pairs of pixels: Y0 Cb Y1 Cr.
-template <class Byte> auto c2LumaFirst(Byte* first, int step)
+template <Order order = Order::ofMemory, class Byte> auto c2LumaFirst(Byte* first, int step)
 {
-    return InterleavedImage<LumaFirst, Byte>{first, step, {}};
+    return InterleavedImage<LumaFirst<order>, Byte>{first, step, {}};
 }
 
 /// Packed pairs of pixels: Cb Y0 Cr Y1.
-template <class Byte> auto c2ChromaFirst(Byte* first, int step)
+template <Order order = Order::ofMemory, class Byte> auto c2ChromaFirst(Byte* first, int step)
 {
-    return InterleavedImage<ChromaFirst, Byte>{first, step, {}};
+    return InterleavedImage<ChromaFirst<order>, Byte>{first, step, {}};
 }
 
 /// The same image with its chroma components exchanged, Cr before Cb.
-template <int Columns, class Byte>
-auto chromaExchanged(const SharedChromaImage<ChromaPlanes<Columns, Byte>, Byte>& image)
+template <int Columns, Order order, class Byte>
+auto chromaExchanged(const SharedChromaImage<ChromaPlanes<Columns, Byte, order>, Byte>& image)
 {
     const auto& [first, step] = image.chroma;
-    return SharedChromaImage<ChromaPlanes<Columns, Byte>, Byte>{
+    return SharedChromaImage<ChromaPlanes<Columns, Byte, order>, Byte>{
         image.first, image.step, {{first[1], first[0]}, {step[1], step[0]}}};
 }
 
-template <class Byte> auto chromaExchanged(const SharedChromaImage<PairedChroma<Byte, false>, Byte>& image)
+template <class Byte, Order order>
+auto chromaExchanged(const SharedChromaImage<PairedChroma<Byte, false, order>, Byte>& image)
 {
     const auto& [first, step] = image.chroma;
-    return SharedChromaImage<PairedChroma<Byte, true>, Byte>{image.first, image.step, {first, step}};
+    return SharedChromaImage<PairedChroma<Byte, true, order>, Byte>{image.first, image.step, {first, step}};
 }
 
 template <class Packing, class Byte> auto chromaExchanged(const InterleavedImage<Packing, Byte>& image)

@@ -34,7 +34,7 @@ PyxStatus PYXCC_CALL pyxiBGRToYCbCr411_8u_AC4P3R(const u8* src, int srcStep, u8*
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), elementsNotNull<3>(dst), sizeAtLeast(roi, 4, 1)))
         return failure;
-    eachRow(roi, reversed(ac4(src, srcStep)), p3<4>(dst, dstStep),
+    eachRow(roi, reversed(ac4<Order::any>(src, srcStep)), p3<4, Order::any>(dst, dstStep),
             spans(upTo<blocksOf<32>, everyColumn>, fours(lumaHigh7, chromaHighU4), tail));
     return warnIfOff(roi, 4, 1);
 }

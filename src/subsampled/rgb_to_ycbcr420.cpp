@@ -52,7 +52,7 @@ PyxStatus PYXCC_CALL pyxiBGRToYCbCr420_8u_AC4P3R(const u8* src, int srcStep, u8*
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), elementsNotNull<3>(dst), sizeAtLeast(roi, 2, 2)))
         return failure;
-    return unsignedHigh(roi, reversed(ac4(src, srcStep)), p3<2>(dst, dstStep));
+    return unsignedHigh(roi, reversed(ac4<Order::any>(src, srcStep)), p3<2, Order::any>(dst, dstStep));
 }
 
 PyxStatus PYXCC_CALL pyxiBGRToYCrCb420_8u_C3P3R(const u8* src, int srcStep, u8* const dst[3], const int dstStep[3],
@@ -68,7 +68,7 @@ PyxStatus PYXCC_CALL pyxiBGRToYCrCb420_8u_AC4P3R(const u8* src, int srcStep, u8*
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), elementsNotNull<3>(dst), sizeAtLeast(roi, 2, 2)))
         return failure;
-    return unsignedHigh(roi, reversed(ac4(src, srcStep)), chromaExchanged(p3<2>(dst, dstStep)));
+    return unsignedHigh(roi, reversed(ac4<Order::any>(src, srcStep)), chromaExchanged(p3<2, Order::any>(dst, dstStep)));
 }
 
 PyxStatus PYXCC_CALL pyxiRGBToYCrCb420_8u_AC4P3R(const u8* src, int srcStep, u8* const dst[3], const int dstStep[3],
@@ -76,7 +76,7 @@ PyxStatus PYXCC_CALL pyxiRGBToYCrCb420_8u_AC4P3R(const u8* src, int srcStep, u8*
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), elementsNotNull<3>(dst), sizeAtLeast(roi, 2, 2)))
         return failure;
-    return unsignedHigh(roi, ac4(src, srcStep), chromaExchanged(p3<2>(dst, dstStep)));
+    return unsignedHigh(roi, ac4<Order::any>(src, srcStep), chromaExchanged(p3<2, Order::any>(dst, dstStep)));
 }
 
 PyxStatus PYXCC_CALL pyxiRGBToYCbCr420_8u_C3P3R(const u8* src, int srcStep, u8* const dst[3], const int dstStep[3],
@@ -99,5 +99,5 @@ PyxStatus PYXCC_CALL pyxiRGBToYCbCr420_8u_C4P2R(const u8* src, int srcStep, u8* 
                                                 int dstCbCrStep, RoiSize roi)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dstY, dstCbCr), sizeAtLeast(roi, 1, 1))) return failure;
-    return rounded(roi, ac4(src, srcStep), p2(dstY, dstYStep, dstCbCr, dstCbCrStep));
+    return rounded(roi, ac4<Order::any>(src, srcStep), p2<Order::any>(dstY, dstYStep, dstCbCr, dstCbCrStep));
 }

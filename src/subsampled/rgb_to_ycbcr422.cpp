@@ -15,20 +15,20 @@ namespace
 {
 
 /// To planes; `wholeColumns` tells whether a last odd column is left alone or gets luma.
-template <auto wholeColumns, class Source>
-void toPlanes(RoiSize roi, const Source& source, u8* const dst[3], const int dstStep[3])
+template <auto wholeColumns, class Source, class Target>
+PyxStatus toPlanes(RoiSize roi, const Source& source, const Target& target)
 {
-    eachRow(roi, source, p3<2>(dst, dstStep),
-            spans(upTo<blocksByTwosThenHalf<16>, wholeColumns>, pairs(lumaHigh7, chromaHighU2),
-                  pairs(lumaExact, chromaEighth<2>)));
+    return eachRow(roi, source, target,
+                   spans(upTo<blocksByTwosThenHalf<16>, wholeColumns>, pairs(lumaHigh7, chromaHighU2),
+                         pairs(lumaExact, chromaEighth<2>)));
 }
 
 /// To packed rows, the pairs in one form; a lone last pixel rounds its chroma as `lastChroma` does.
-template <class Source, class LastChroma>
-PyxStatus toPacked(RoiSize roi, const Source& source, u8* dst, int dstStep, LastChroma lastChroma)
+template <class Source, class Target, class LastChroma>
+PyxStatus toPacked(RoiSize roi, const Source& source, const Target& target, LastChroma lastChroma)
 {
     return eachRow(
-        roi, source, c2LumaFirst(dst, dstStep),
+        roi, source, target,
         spans(upTo<wholePairs, everyColumn>, pairs(lumaHigh7, chromaHighS<64>), pairs(lumaExact, lastChroma)));
 }
 
@@ -47,8 +47,7 @@ PyxStatus PYXCC_CALL pyxiBGRToYCbCr422_8u_C3P3R(const u8* src, int srcStep, u8* 
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), elementsNotNull<3>(dst), sizeAtLeast(roi, 2, 1)))
         return failure;
-    toPlanes<everyColumn>(roi, reversed(c3(src, srcStep)), dst, dstStep);
-    return pyxOk;
+    return toPlanes<everyColumn>(roi, reversed(c3(src, srcStep)), p3<2>(dst, dstStep));
 }
 
 PyxStatus PYXCC_CALL pyxiBGRToYCbCr422_8u_AC4P3R(const u8* src, int srcStep, u8* const dst[3], const int dstStep[3],
@@ -56,8 +55,7 @@ PyxStatus PYXCC_CALL pyxiBGRToYCbCr422_8u_AC4P3R(const u8* src, int srcStep, u8*
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), elementsNotNull<3>(dst), sizeAtLeast(roi, 2, 1)))
         return failure;
-    toPlanes<everyColumn>(roi, reversed(ac4(src, srcStep)), dst, dstStep);
-    return pyxOk;
+    return toPlanes<everyColumn>(roi, reversed(ac4<Order::any>(src, srcStep)), p3<2, Order::any>(dst, dstStep));
 }
 
 PyxStatus PYXCC_CALL pyxiRGBToYCbCr422_8u_C3P3R(const u8* src, int srcStep, u8* const dst[3], const int dstStep[3],
@@ -65,20 +63,21 @@ PyxStatus PYXCC_CALL pyxiRGBToYCbCr422_8u_C3P3R(const u8* src, int srcStep, u8* 
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), elementsNotNull<3>(dst), sizeAtLeast(roi, 2, 1)))
         return failure;
-    toPlanes<wholePairs>(roi, c3(src, srcStep), dst, dstStep);
+    toPlanes<wholePairs>(roi, c3(src, srcStep), p3<2>(dst, dstStep));
     return warnIfOff(roi, 2, 1);
 }
 
 PyxStatus PYXCC_CALL pyxiBGRToYCbCr422_8u_C3C2R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 2, 1))) return failure;
-    return toPacked(roi, reversed(c3(src, srcStep)), dst, dstStep, chromaEighth<1>);
+    return toPacked(roi, reversed(c3(src, srcStep)), c2LumaFirst(dst, dstStep), chromaEighth<1>);
 }
 
 PyxStatus PYXCC_CALL pyxiBGRToYCbCr422_8u_AC4C2R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 2, 1))) return failure;
-    return toPacked(roi, reversed(ac4(src, srcStep)), dst, dstStep, chromaNearest<1>);
+    return toPacked(roi, reversed(ac4<Order::any>(src, srcStep)), c2LumaFirst<Order::any>(dst, dstStep),
+                    chromaNearest<1>);
 }
 
 PyxStatus PYXCC_CALL pyxiRGBToYCbCr422_8u_C3C2R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)

@@ -26,7 +26,7 @@ template <class Target> PyxStatus fromC3(RoiSize roi, const u8* src, int srcStep
 
 template <class Target> PyxStatus fromAC4(RoiSize roi, const u8* src, int srcStep, const Target& target)
 {
-    eachRowPair(roi, reversed(ac4(src, srcStep)), target,
+    eachRowPair(roi, reversed(ac4<Order::any>(src, srcStep)), target,
                 spans(upTo<blocksOf<8>, wholePairs>, pairs(LumaHighStudio{}, ChromaHighS{}), studioTail));
     return warnIfOff(roi, 2, 2);
 }
@@ -64,7 +64,7 @@ PyxStatus PYXCC_CALL pyxiBGRToYCbCr420_709CSC_8u_AC4P3R(const u8* src, int srcSt
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), elementsNotNull<3>(dst), sizeAtLeast(roi, 2, 2)))
         return failure;
-    return fromAC4(roi, src, srcStep, p3<2>(dst, dstStep));
+    return fromAC4(roi, src, srcStep, p3<2, Order::any>(dst, dstStep));
 }
 
 PyxStatus PYXCC_CALL pyxiBGRToYCrCb420_709CSC_8u_AC4P3R(const u8* src, int srcStep, u8* const dst[3],
@@ -72,7 +72,7 @@ PyxStatus PYXCC_CALL pyxiBGRToYCrCb420_709CSC_8u_AC4P3R(const u8* src, int srcSt
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), elementsNotNull<3>(dst), sizeAtLeast(roi, 2, 2)))
         return failure;
-    return fromAC4(roi, src, srcStep, chromaExchanged(p3<2>(dst, dstStep)));
+    return fromAC4(roi, src, srcStep, chromaExchanged(p3<2, Order::any>(dst, dstStep)));
 }
 
 PyxStatus PYXCC_CALL pyxiBGRToYCbCr420_709HDTV_8u_AC4P3R(const u8* src, int srcStep, u8* const dst[3],
@@ -80,7 +80,7 @@ PyxStatus PYXCC_CALL pyxiBGRToYCbCr420_709HDTV_8u_AC4P3R(const u8* src, int srcS
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), elementsNotNull<3>(dst), sizeAtLeast(roi, 2, 2)))
         return failure;
-    eachRowPair(roi, reversed(ac4(src, srcStep)), p3<2>(dst, dstStep),
+    eachRowPair(roi, reversed(ac4<Order::any>(src, srcStep)), p3<2, Order::any>(dst, dstStep),
                 spans(upTo<blocksOf<8>, wholePairs>, pairs(LumaHighHdtv{}, ChromaHighHdtv<32>{}),
                       pairs(LumaExactHdtv{}, ChromaExactHdtv{})));
     return warnIfOff(roi, 2, 2);
@@ -97,6 +97,6 @@ PyxStatus PYXCC_CALL pyxiBGRToCbYCr422_709HDTV_8u_C3C2R(const u8* src, int srcSt
 PyxStatus PYXCC_CALL pyxiBGRToCbYCr422_709HDTV_8u_AC4C2R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return eachRow(roi, reversed(ac4(src, srcStep)), c2ChromaFirst(dst, dstStep),
+    return eachRow(roi, reversed(ac4<Order::any>(src, srcStep)), c2ChromaFirst<Order::any>(dst, dstStep),
                    spans(upTo<wholePairs, everyColumn>, hdtvPairs, redAndBlueExchanged(hdtvLone)));
 }

@@ -115,20 +115,46 @@ PYXCC_INLINE wide::U8 joinPairs(const ChromaPairs& x)
     return wide::U8(_mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1));
 }
 
-/// Writes the samples of two components that forms made of sums of `Columns` neighbours, 32 / Columns of each.
-template <int Columns> PYXCC_INLINE void storeApart(u8* a, u8* b, const Two<wide::Byte>& x)
+/// Samples that stand in another order, brought back to that of memory: each four is where loadQuadruples() puts it.
+template <Order order> PYXCC_INLINE wide::U8 inMemoryOrder(wide::U8 x)
 {
-    const __m256i lanes = _mm256_packus_epi16(x.a.v, x.b.v); // eight words of each, in each lane
+    if constexpr (order == Order::ofMemory) return x;
+    return wide::U8(_mm256_permutevar8x32_epi32(x.v, _mm256_setr_epi32(0, 4, 1, 5, 2, 6, 3, 7)));
+}
+
+namespace detail
+{
+
+/// Where the chroma samples of a component are, in order, once its words are narrowed to 8 bytes from each lane. Sums
+/// of fours have every other word to themselves.
+template <int Columns, Order order>
+constexpr Places chromaPlaces = [] {
+    Places places{};
+    for (int i = 0; i < wide::U8::count / Columns; ++i) {
+        const int column = i * Columns, four = column / 4;
+        const int four8 = order == Order::ofMemory ? four : four / 2 + four % 2 * 4; // 8 fours in 16 bytes
+        places[i] = static_cast<u8>(2 * four8 + column % 4 / 2);
+    }
+    return places;
+}();
+
+} // namespace detail
+
+/// Writes the samples of two components that forms made of sums of `Columns` neighbours, 32 / Columns of each.
+template <int Columns, Order order = Order::ofMemory>
+PYXCC_INLINE void storeApart(u8* a, u8* b, const Two<wide::Byte>& x)
+{
+    __m256i apart = detail::swapMiddle(_mm256_packus_epi16(x.a.v, x.b.v));
+    if constexpr (Columns != 2 || order != Order::ofMemory) {
+        apart = detail::shuffle(apart, detail::chromaPlaces<Columns, order>);
+    }
+    const __m128i first = _mm256_castsi256_si128(apart), second = _mm256_extracti128_si256(apart, 1);
     if constexpr (Columns == 2) {
-        const __m256i apart = detail::swapMiddle(lanes);
-        storeHalf(a, {_mm256_castsi256_si128(apart)});
-        storeHalf(b, {_mm256_extracti128_si256(apart, 1)});
+        storeHalf(a, {first});
+        storeHalf(b, {second});
     } else {
-        const __m256i evens = detail::shuffle(lanes, detail::evensThenOdds);
-        const __m128i apart =
-            _mm256_castsi256_si128(_mm256_permutevar8x32_epi32(evens, _mm256_setr_epi32(0, 4, 1, 5, 0, 4, 1, 5)));
-        _mm_storel_epi64(reinterpret_cast<__m128i*>(a), apart);
-        _mm_storeh_pd(reinterpret_cast<double*>(b), _mm_castsi128_pd(apart));
+        _mm_storel_epi64(reinterpret_cast<__m128i*>(a), first);
+        _mm_storel_epi64(reinterpret_cast<__m128i*>(b), second);
     }
 }
 
@@ -206,11 +232,16 @@ template <int First> PYXCC_INLINE Two<wide::Sample> chromaOfPairs(const Two<wide
 }
 
 /// Writes 64 bytes, the even ones from `even`.
-PYXCC_INLINE void storeAlternating(u8* p, wide::U8 even, wide::U8 odd)
+template <Order order = Order::ofMemory> PYXCC_INLINE void storeAlternating(u8* p, wide::U8 even, wide::U8 odd)
 {
     const __m256i low = _mm256_unpacklo_epi8(even.v, odd.v), high = _mm256_unpackhi_epi8(even.v, odd.v);
-    detail::storeWhole(p, _mm256_permute2x128_si256(low, high, 0x20));
-    detail::storeWhole(p + 32, _mm256_permute2x128_si256(low, high, 0x31));
+    if constexpr (order == Order::ofMemory) {
+        detail::storeWhole(p, _mm256_permute2x128_si256(low, high, 0x20));
+        detail::storeWhole(p + 32, _mm256_permute2x128_si256(low, high, 0x31));
+    } else {
+        detail::storeWhole(p, detail::swapMiddle(low));
+        detail::storeWhole(p + 32, detail::swapMiddle(high));
+    }
 }
 
 } // namespace pyxcc::layouts
