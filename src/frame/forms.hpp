@@ -12,7 +12,10 @@ namespace pyxcc::frame
 struct OnWords {
 };
 
-PYXCC_INLINE wide::U8 narrowAll(wide::Byte low, wide::Byte high) { return narrow(low, high); }
+template <std::derived_from<wide::Byte> Byte> PYXCC_INLINE wide::U8 narrowAll(Byte low, Byte high)
+{
+    return narrow(low, high);
+}
 PYXCC_INLINE Three<wide::U8> narrowAll(const Three<wide::Byte>& low, const Three<wide::Byte>& high)
 {
     return {narrow(low.a, high.a), narrow(low.b, high.b), narrow(low.c, high.c)};

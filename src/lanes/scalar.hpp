@@ -67,7 +67,7 @@ inline S16 asS16(U16 x) { return x.v; }
 
 inline Byte sat8(S16 x) { return {static_cast<u8>(std::clamp<int>(x.v, 0, 255))}; }
 inline Byte sat8(U16 x) { return {static_cast<u8>(std::min<int>(x.v, 255))}; }
-inline Byte clampTo(S16 x, int low, int high) { return {static_cast<u8>(std::clamp<int>(x.v, low, high))}; }
+template <int Low, int High> Byte clampTo(S16 x) { return {static_cast<u8>(std::clamp<int>(x.v, Low, High))}; }
 inline Byte low8(S16 x) { return {static_cast<u8>(x.v)}; }
 
 inline S16 mulRound15(S16 x, int k) { return (x.v * k + 16384) >> 15; }

@@ -22,14 +22,14 @@ namespace pyxcc::layouts
 /// columns.
 template <int Columns, class Luma, class Chroma> struct SharedChroma {
     Luma luma;
-    Two<Chroma> chroma;
+    Chroma chroma;
 };
 
 /// What a target takes.
-template <int Columns, class Luma> using ChromaOfSums = SharedChroma<Columns, Luma, wide::Byte>;
+template <int Columns, class Luma> using ChromaOfSums = SharedChroma<Columns, Luma, NarrowedPairs>;
 
 /// What a source gives: chroma as words, a sample for every pair. Samples of fours come twice.
-template <class Luma> using ChromaOfPairs = SharedChroma<2, Luma, wide::Sample>;
+template <class Luma> using ChromaOfPairs = SharedChroma<2, Luma, Two<wide::Sample>>;
 
 /// Rows of two planes of chroma.
 template <int Columns, class Byte, Order Within = Order::ofMemory> struct ChromaPlanesRow {
@@ -47,12 +47,12 @@ template <int Columns, class Byte, Order Within = Order::ofMemory> struct Chroma
         return {loadPart(a + x / Columns, count), loadPart(b + x / Columns, count)};
     }
 
-    PYXCC_INLINE void store(int x, const Two<wide::Byte>& chroma) const
+    PYXCC_INLINE void store(int x, NarrowedPairs chroma) const
     {
         storeApart<Columns, order>(a + x / Columns, b + x / Columns, chroma);
     }
 
-    PYXCC_INLINE void store(int x, int count, const Two<wide::Byte>& chroma) const
+    PYXCC_INLINE void store(int x, int count, NarrowedPairs chroma) const
     {
         u8 bufferA[wide::U8::count / Columns], bufferB[wide::U8::count / Columns];
         storeApart<Columns, order>(bufferA, bufferB, chroma);
@@ -86,14 +86,11 @@ template <class Byte, bool Exchanged, Order Within = Order::ofMemory> struct Chr
     PYXCC_INLINE Two<wide::Sample> load(int x) const { return apart(pairs.load(x)); }
     PYXCC_INLINE Two<wide::Sample> load(int x, int count) const { return apart(pairs.load(x, count + (count & 1))); }
 
-    PYXCC_INLINE void store(int x, const Two<wide::Byte>& chroma) const
-    {
-        pairs.store(x, inMemoryOrder<order>(narrowInTurn(chroma)));
-    }
+    PYXCC_INLINE void store(int x, NarrowedPairs chroma) const { pairs.store(x, inMemoryOrder<order>(inTurn(chroma))); }
 
-    PYXCC_INLINE void store(int x, int count, const Two<wide::Byte>& chroma) const
+    PYXCC_INLINE void store(int x, int count, NarrowedPairs chroma) const
     {
-        pairs.store(x, count & ~1, inMemoryOrder<order>(narrowInTurn(chroma)));
+        pairs.store(x, count & ~1, inMemoryOrder<order>(inTurn(chroma)));
     }
 
 private:
@@ -195,7 +192,7 @@ template <Order order> struct LumaFirst {
 
     static PYXCC_INLINE void store(u8* p, const ChromaOfSums<2, wide::U8>& pixels)
     {
-        storeAlternating<order>(p, pixels.luma, narrowInTurn(pixels.chroma));
+        storeAlternating<order>(p, pixels.luma, inTurn(pixels.chroma));
     }
 
     /// A last odd pixel has one chroma sample of its own; the other one is that of the pair before, right in front of
@@ -217,7 +214,7 @@ template <Order order> struct ChromaFirst {
 
     static PYXCC_INLINE void store(u8* p, const ChromaOfSums<2, wide::U8>& pixels)
     {
-        storeAlternating<order>(p, narrowInTurn(pixels.chroma), pixels.luma);
+        storeAlternating<order>(p, inTurn(pixels.chroma), pixels.luma);
     }
 
     /// A last odd pixel has one chroma sample of its own; the other one is that of the pair before. In a row of one

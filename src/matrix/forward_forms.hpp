@@ -35,7 +35,7 @@ template <Clamp ends, class S16> PYXCC_INLINE auto clamped(const S16& x)
     if constexpr (ends.low == 0 && ends.high == 255) {
         return sat8(x);
     } else {
-        return clampTo(x, ends.low, ends.high);
+        return clampTo<ends.low, ends.high>(x);
     }
 }
 

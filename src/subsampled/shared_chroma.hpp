@@ -41,8 +41,8 @@ template <int Columns, class Luma, class Chroma>
 PYXCC_INLINE auto apply(const SharedForm<Columns, Luma, Chroma>& form, const Three<wide::U8>& row)
 {
     using Sums = layouts::Sums<Columns, wide::U8>;
-    return layouts::ChromaOfSums<Columns, wide::U8>{apply(form.luma, row),
-                                                    form.chroma(Sums(row.a), Sums(row.b), Sums(row.c))};
+    return layouts::ChromaOfSums<Columns, wide::U8>{
+        apply(form.luma, row), layouts::narrowPairs(form.chroma(Sums(row.a), Sums(row.b), Sums(row.c)))};
 }
 
 template <int Columns, class Luma, class Chroma>
@@ -53,7 +53,8 @@ PYXCC_INLINE auto apply(const SharedForm<Columns, Luma, Chroma>& form, const Two
     using Sums = layouts::Sums<Columns, Rows>;
     return layouts::ChromaOfSums<Columns, Two<wide::U8>>{
         {apply(form.luma, upper), apply(form.luma, lower)},
-        form.chroma(Sums(Rows{upper.a, lower.a}), Sums(Rows{upper.b, lower.b}), Sums(Rows{upper.c, lower.c}))};
+        layouts::narrowPairs(
+            form.chroma(Sums(Rows{upper.a, lower.a}), Sums(Rows{upper.b, lower.b}), Sums(Rows{upper.c, lower.c})))};
 }
 
 /// A form that takes the one for the other.

@@ -22,7 +22,8 @@ template <class Form> void expectInstancesAgree(const Form& form, const SumsOf16
     using pyxcc::scalar::S16;
     const auto& [r, g, b] = sums;
     std::array<u8, 16> cb, cr;
-    pyxcc::layouts::storeApart<2>(cb.data(), cr.data(), form(loadWords(r), loadWords(g), loadWords(b)));
+    pyxcc::layouts::storeApart<2>(cb.data(), cr.data(),
+                                  pyxcc::layouts::narrowPairs(form(loadWords(r), loadWords(g), loadWords(b))));
     for (int i = 0; i < 16; ++i) {
         const auto one = bytesOf(form(S16(r[i]), S16(g[i]), S16(b[i])));
         const bool same = cb[i] == one[0] && cr[i] == one[1];

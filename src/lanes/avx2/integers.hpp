@@ -92,15 +92,17 @@ struct Byte : Integers {
     PYXCC_INLINE Byte(__m256i value) : Integers(value) {}
 };
 
+/// The same for samples that narrow() clamps to Low..High, once they are bytes, which is half of the work.
+template <int Low, int High> struct ByteWithin : Byte {
+    using Byte::Byte;
+};
+
 PYXCC_INLINE U16 asU16(S16 x) { return U16(x.v); }
 PYXCC_INLINE S16 asS16(U16 x) { return S16(x.v); }
 
 PYXCC_INLINE Byte sat8(S16 x) { return {x.v}; }
 PYXCC_INLINE Byte sat8(U16 x) { return {_mm256_min_epu16(x.v, _mm256_set1_epi16(255))}; }
-PYXCC_INLINE Byte clampTo(S16 x, int low, int high)
-{
-    return {_mm256_min_epi16(_mm256_max_epi16(x.v, S16(low).v), S16(high).v)};
-}
+template <int Low, int High> PYXCC_INLINE ByteWithin<Low, High> clampTo(S16 x) { return {x.v}; }
 PYXCC_INLINE Byte low8(S16 x) { return {_mm256_and_si256(x.v, _mm256_set1_epi16(255))}; }
 
 PYXCC_INLINE S16 mulRound15(S16 x, int k) { return S16(_mm256_mulhrs_epi16(x.v, S16(k).v)); }
@@ -147,5 +149,11 @@ PYXCC_INLINE Two<Sample> widen(U8 x)
 }
 
 PYXCC_INLINE U8 narrow(Byte low, Byte high) { return U8(_mm256_packus_epi16(low.v, high.v)); }
+
+template <int Low, int High> PYXCC_INLINE U8 narrow(ByteWithin<Low, High> low, ByteWithin<Low, High> high)
+{
+    const __m256i bytes = _mm256_packus_epi16(low.v, high.v);
+    return U8(_mm256_min_epu8(_mm256_max_epu8(bytes, U8(Low).v), U8(High).v));
+}
 
 } // namespace pyxcc::wide

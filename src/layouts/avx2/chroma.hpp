@@ -140,11 +140,20 @@ constexpr Places chromaPlaces = [] {
 
 } // namespace detail
 
-/// Writes the samples of two components that forms made of sums of `Columns` neighbours, 32 / Columns of each.
-template <int Columns, Order order = Order::ofMemory>
-PYXCC_INLINE void storeApart(u8* a, u8* b, const Two<wide::Byte>& x)
+/// The samples of two chroma components that forms make of sums, narrowed together: in each half eight words' of the
+/// one and then eight words' of the other.
+struct NarrowedPairs {
+    wide::U8 v;
+};
+
+template <class Byte> PYXCC_INLINE NarrowedPairs narrowPairs(const Two<Byte>& x) { return {narrow(x.a, x.b)}; }
+
+PYXCC_INLINE NarrowedPairs exchanged(NarrowedPairs x) { return {wide::U8(_mm256_shuffle_epi32(x.v.v, 0x4e))}; }
+
+/// Writes the samples of each component of sums of `Columns` neighbours, 32 / Columns of them.
+template <int Columns, Order order = Order::ofMemory> PYXCC_INLINE void storeApart(u8* a, u8* b, NarrowedPairs x)
 {
-    __m256i apart = detail::swapMiddle(_mm256_packus_epi16(x.a.v, x.b.v));
+    __m256i apart = detail::swapMiddle(x.v.v);
     if constexpr (Columns != 2 || order != Order::ofMemory) {
         apart = detail::shuffle(apart, detail::chromaPlaces<Columns, order>);
     }
@@ -158,11 +167,8 @@ PYXCC_INLINE void storeApart(u8* a, u8* b, const Two<wide::Byte>& x)
     }
 }
 
-/// The samples of two components that forms made of sums of pairs, interleaved.
-PYXCC_INLINE wide::U8 narrowInTurn(const Two<wide::Byte>& x)
-{
-    return wide::U8(detail::shuffle(_mm256_packus_epi16(x.a.v, x.b.v), detail::halvesInTurn));
-}
+/// The samples of both components of sums of two neighbours, interleaved.
+PYXCC_INLINE wide::U8 inTurn(NarrowedPairs x) { return wide::U8(detail::shuffle(x.v.v, detail::halvesInTurn)); }
 
 /// The even bytes of one block and the odd ones of another.
 PYXCC_INLINE wide::U8 inTurn(wide::U8 even, wide::U8 odd)
