@@ -39,7 +39,11 @@ namespace detail
 {
 
 /// The slope near to which that of a sixteen must be.
-constexpr int meanSlope(const ByteTable& table, int h) { return (table[16 * h + 15] - table[16 * h]) * 64 / 15; }
+constexpr int meanSlope(const ByteTable& table, int h)
+{
+    const int first = 16 * h, last = first + 15;
+    return (table[last] - table[first]) * 64 / 15;
+}
 
 constexpr void setBit(ByteCurve& curve, int v) { curve.bits[v / 128][v % 16] |= static_cast<u8>(1 << (v / 16 % 8)); }
 

@@ -5,8 +5,7 @@
 #include "lanes/groups.hpp"
 #include "lanes/inline.hpp"
 
-#include <cstddef>
-#include <iterator>
+#include <array>
 #include <type_traits>
 
 namespace pyxcc
@@ -24,7 +23,7 @@ PYXCC_INLINE auto each(const Operation& operation, const Several<Lanes, N>&... x
 }
 
 template <class Lane, int N> struct Several {
-    Lane part[N];
+    std::array<Lane, N> part;
 
     Several() = default;
 
@@ -113,8 +112,7 @@ PYXCC_INLINE auto whereEqual(const Several<F32, N>& x, const Several<F32, N>& y,
 template <class Lane, class... Lanes> PYXCC_INLINE auto several(Lane first, Lanes... rest)
 {
     Several<Lane, 1 + sizeof...(Lanes)> result;
-    const Lane parts[] = {first, rest...};
-    for (std::size_t i = 0; i < std::size(parts); ++i) result.part[i] = parts[i];
+    result.part = {first, rest...};
     return result;
 }
 

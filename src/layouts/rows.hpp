@@ -91,17 +91,17 @@ template <class Register, int PixelSamples> struct AsTheyLie {
     static PYXCC_INLINE Several<Samples, registers> load(const u8* p)
     {
         Several<Samples, registers> samples;
-        for (int i = 0; i < registers; ++i) samples.part[i] = loadSamples<Samples>(p + 32 * i);
+        for (int i = 0; i < registers; ++i, p += 32) samples.part[i] = loadSamples<Samples>(p);
         return samples;
     }
 
     static PYXCC_INLINE void store(u8* p, const Several<Samples, registers>& samples)
     {
-        for (int i = 0; i < registers; ++i) {
+        for (int i = 0; i < registers; ++i, p += 32) {
             if constexpr (PixelSamples == 4) {
-                storeButFourths(p + 32 * i, samples.part[i]);
+                storeButFourths(p, samples.part[i]);
             } else {
-                storeSamples(p + 32 * i, samples.part[i]);
+                storeSamples(p, samples.part[i]);
             }
         }
     }

@@ -19,7 +19,7 @@ using Four = std::uint64_t; // samples, the first one lowest
 
 PYXCC_INLINE Four loadFour(const u8* p)
 {
-    Four samples;
+    Four samples = 0;
     std::memcpy(&samples, p, sizeof samples);
     return samples;
 }
@@ -41,7 +41,7 @@ template <class Samples> PYXCC_INLINE void store(u8* p, const Samples& samples)
 
 PYXCC_INLINE void lookUpOne(const u16* table, const u8* from, u8* to)
 {
-    u16 sample;
+    u16 sample = 0;
     std::memcpy(&sample, from, sizeof sample);
     store(to, table[sample]);
 }
