@@ -9,4 +9,5 @@
 #include "reference/repack.hpp"
 #include "reference/rgb_to_subsampled.hpp"
 #include "reference/rgb_ycbcr.hpp"
+#include "reference/rgb_yuv.hpp"
 #include "reference/subsampled_to_rgb.hpp"
