@@ -11,3 +11,5 @@
 #include "reference/rgb_ycbcr.hpp"
 #include "reference/rgb_yuv.hpp"
 #include "reference/subsampled_to_rgb.hpp"
+#include "reference/ycbcr_to_packed.hpp"
+#include "reference/ycbcr_to_packed_dither.hpp"
