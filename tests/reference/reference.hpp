@@ -12,5 +12,6 @@
 #include "reference/rgb_ycbcr.hpp"
 #include "reference/rgb_yuv.hpp"
 #include "reference/subsampled_to_rgb.hpp"
+#include "reference/xyz_ycc.hpp"
 #include "reference/ycbcr_to_packed.hpp"
 #include "reference/ycbcr_to_packed_dither.hpp"
