@@ -17,3 +17,4 @@
 #include "reference/xyz_ycc.hpp"
 #include "reference/ycbcr_to_packed.hpp"
 #include "reference/ycbcr_to_packed_dither.hpp"
+#include "reference/yuv_subsampled.hpp"

@@ -94,6 +94,16 @@ Triple<u8> yuvInvExactC(Triple<u8> yuv)
     };
 }
 
+Triple<u8> yuvInvExactD(Triple<u8> yuv)
+{
+    const s32 y = yuv[0] * 65536, u = yuv[1] - 128, v = yuv[2] - 128;
+    return {
+        sat8((y + 74711 * v) >> 16),
+        sat8((y - 25821 * u - 38076 * v) >> 16),
+        sat8((y + 133169 * u) >> 16),
+    };
+}
+
 Triple<u8> yuvInvHigh3(Triple<u8> yuv)
 {
     const s32 y = yuv[0], u = (yuv[1] - 128) * 8, v = (yuv[2] - 128) * 8;
@@ -114,6 +124,17 @@ Triple<u8> yuvInvHigh4(Triple<u8> yuv)
     };
 }
 
+// yuvInvHigh4 with weights one apart.
+Triple<u8> yuvInvHigh4x(Triple<u8> yuv)
+{
+    const s32 y = 2 * yuv[0], u = (yuv[1] - 128) * 16, v = (yuv[2] - 128) * 16;
+    return {
+        sat8((y + mulHighS16(v, 9339)) >> 1),
+        sat8((y + mulHighS16(u, -3228) + mulHighS16(v, -4760)) >> 1),
+        sat8((y + mulHighS16(u, 16646)) >> 1),
+    };
+}
+
 Triple<u8> yuvInvHigh7(Triple<u8> yuv)
 {
     const s32 y = 8 * yuv[0], u = (yuv[1] - 128) * 128, v = (yuv[2] - 128) * 128;
@@ -121,6 +142,27 @@ Triple<u8> yuvInvHigh7(Triple<u8> yuv)
         sat8((y + mulHighS16(v, 4669) + 4) >> 3),
         sat8((y - mulHighS16(v, 2380) - mulHighS16(u, 1614) + 4) >> 3),
         sat8((y + mulHighS16(u, 8323) + 4) >> 3),
+    };
+}
+
+// The products of green are subtracted as one sum.
+Triple<u8> yuvInvHigh8(Triple<u8> yuv)
+{
+    const s32 y = 16 * yuv[0], u = (yuv[1] - 128) * 128, v = (yuv[2] - 128) * 128;
+    return {
+        sat8((y + mulHighS16(v, 9338) + 8) >> 4),
+        sat8((y - (mulHighS16(u, 3227) + mulHighS16(v, 4759)) + 8) >> 4),
+        sat8((y + mulHighS16(u, 16646) + 8) >> 4),
+    };
+}
+
+Triple<u8> yuv422OddInv13(Triple<u8> yuv)
+{
+    const s32 y = yuv[0] * 8192, u = yuv[1] - 128, v = yuv[2] - 128;
+    return {
+        sat8((y + 9338 * v) >> 13),
+        sat8((y - 3227 * u - 4759 * v) >> 13),
+        sat8((y + 16645 * u) >> 13),
     };
 }
 

@@ -17,8 +17,12 @@ Triple<u8> yuvFwdPlanar(Triple<u8> rgb);
 Triple<u8> yuvInvExactA(Triple<u8> yuv);
 Triple<u8> yuvInvExactB(Triple<u8> yuv);
 Triple<u8> yuvInvExactC(Triple<u8> yuv);
+Triple<u8> yuvInvExactD(Triple<u8> yuv);
 Triple<u8> yuvInvHigh3(Triple<u8> yuv);
 Triple<u8> yuvInvHigh4(Triple<u8> yuv);
+Triple<u8> yuvInvHigh4x(Triple<u8> yuv);
 Triple<u8> yuvInvHigh7(Triple<u8> yuv);
+Triple<u8> yuvInvHigh8(Triple<u8> yuv);
+Triple<u8> yuv422OddInv13(Triple<u8> yuv);
 
 } // namespace reference
