@@ -1,24 +1,27 @@
-// From floats to integers.
+// From floats to samples.
 #pragma once
 
 #include "pyxcc/types.h"
 
+#include <algorithm>
 #include <cmath>
 #include <limits>
 
 namespace reference
 {
 
-/// Numbers beyond 32 bits, and what is no number, become the least integer, as the processor has it.
-inline s32 integerOf(f32 whole)
+/// In the rounding mode in force.
+inline s32 nearest(f32 x) { return static_cast<s32>(std::nearbyint(x)); }
+
+inline s32 truncated(f32 x) { return static_cast<s32>(x); }
+
+/// The nearest sample of the type.
+template <typename T> T saturated(s32 x)
 {
-    return std::fabs(whole) < 2147483648.0f ? static_cast<s32>(whole) : std::numeric_limits<s32>::min();
+    return static_cast<T>(std::clamp<s32>(x, std::numeric_limits<T>::min(), std::numeric_limits<T>::max()));
 }
 
-/// In the rounding mode in force.
-inline s32 nearest(f32 x) { return integerOf(std::nearbyint(x)); }
-
-/// Towards zero.
-inline s32 truncated(f32 x) { return integerOf(x); }
+/// The low bits of x.
+template <typename T> T lowBits(s32 x) { return static_cast<T>(x); }
 
 } // namespace reference

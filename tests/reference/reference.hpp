@@ -7,6 +7,7 @@
 #include "reference/filter_interlace.hpp"
 #include "reference/gamma.hpp"
 #include "reference/gray.hpp"
+#include "reference/hls.hpp"
 #include "reference/lab.hpp"
 #include "reference/packed_rgb.hpp"
 #include "reference/repack.hpp"
