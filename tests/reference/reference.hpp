@@ -8,6 +8,7 @@
 #include "reference/gamma.hpp"
 #include "reference/gray.hpp"
 #include "reference/hls.hpp"
+#include "reference/hsv.hpp"
 #include "reference/lab.hpp"
 #include "reference/packed_rgb.hpp"
 #include "reference/repack.hpp"
