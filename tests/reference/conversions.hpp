@@ -10,6 +10,7 @@
 namespace reference
 {
 
+<<<<<<< HEAD
 /// In the rounding mode in force.
 inline s32 nearest(f32 x) { return static_cast<s32>(std::nearbyint(x)); }
 
@@ -23,5 +24,18 @@ template <typename T> T saturated(s32 x)
 
 /// The low bits of x.
 template <typename T> T lowBits(s32 x) { return static_cast<T>(x); }
+=======
+/// Numbers beyond 32 bits, and what is no number, become the least integer, as the processor has it.
+template <typename F> s32 integerOf(F whole)
+{
+    return std::fabs(whole) < F{2147483648} ? static_cast<s32>(whole) : std::numeric_limits<s32>::min();
+}
+
+/// In the rounding mode in force.
+inline s32 nearest(f32 x) { return integerOf(std::nearbyint(x)); }
+
+/// Towards zero.
+template <typename F> s32 truncated(F x) { return integerOf(x); }
+>>>>>>> dbc0ceb (Plain statements of LUV: 20 conversions)
 
 } // namespace reference

@@ -10,6 +10,7 @@
 #include "reference/hls.hpp"
 #include "reference/hsv.hpp"
 #include "reference/lab.hpp"
+#include "reference/luv.hpp"
 #include "reference/packed_rgb.hpp"
 #include "reference/repack.hpp"
 #include "reference/rgb_to_subsampled.hpp"
