@@ -20,4 +20,5 @@
 #include "reference/xyz_ycc.hpp"
 #include "reference/ycbcr_to_packed.hpp"
 #include "reference/ycbcr_to_packed_dither.hpp"
+#include "reference/ycocg.hpp"
 #include "reference/yuv_subsampled.hpp"
