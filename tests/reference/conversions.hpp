@@ -10,21 +10,6 @@
 namespace reference
 {
 
-<<<<<<< HEAD
-/// In the rounding mode in force.
-inline s32 nearest(f32 x) { return static_cast<s32>(std::nearbyint(x)); }
-
-inline s32 truncated(f32 x) { return static_cast<s32>(x); }
-
-/// The nearest sample of the type.
-template <typename T> T saturated(s32 x)
-{
-    return static_cast<T>(std::clamp<s32>(x, std::numeric_limits<T>::min(), std::numeric_limits<T>::max()));
-}
-
-/// The low bits of x.
-template <typename T> T lowBits(s32 x) { return static_cast<T>(x); }
-=======
 /// Numbers beyond 32 bits, and what is no number, become the least integer, as the processor has it.
 template <typename F> s32 integerOf(F whole)
 {
@@ -36,6 +21,14 @@ inline s32 nearest(f32 x) { return integerOf(std::nearbyint(x)); }
 
 /// Towards zero.
 template <typename F> s32 truncated(F x) { return integerOf(x); }
->>>>>>> dbc0ceb (Plain statements of LUV: 20 conversions)
+
+/// The nearest sample of the type.
+template <typename T> T saturated(s32 x)
+{
+    return static_cast<T>(std::clamp<s32>(x, std::numeric_limits<T>::min(), std::numeric_limits<T>::max()));
+}
+
+/// The low bits of x.
+template <typename T> T lowBits(s32 x) { return static_cast<T>(x); }
 
 } // namespace reference
