@@ -50,9 +50,6 @@ Range rangeOf(f32 r, f32 g, f32 b)
     return {M, m, M - m, M + m};
 }
 
-/// By one step; v is what x approximates the reciprocal of.
-f32 refined(f32 x, f32 v) { return std::fma(-x, std::fma(x, v, -1.0f), x); }
-
 template <typename T> f32 bodyReciprocal(f32 v) { return sizeof(T) == 1 ? rcp(v) : refined(rcp(v), v); }
 
 /// From R, G, B to H, L, S in the body of a row.
