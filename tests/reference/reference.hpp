@@ -17,6 +17,7 @@
 #include "reference/rgb_ycbcr.hpp"
 #include "reference/rgb_yuv.hpp"
 #include "reference/subsampled_to_rgb.hpp"
+#include "reference/tone_map.hpp"
 #include "reference/xyz_ycc.hpp"
 #include "reference/ycbcr_to_packed.hpp"
 #include "reference/ycbcr_to_packed_dither.hpp"
