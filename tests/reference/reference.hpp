@@ -3,7 +3,9 @@
 
 #include "reference/bt709.hpp"
 #include "reference/cbycr422.hpp"
+#include "reference/cfa_to_rgb.hpp"
 #include "reference/color_twist.hpp"
+#include "reference/demosaic_ahd.hpp"
 #include "reference/filter_interlace.hpp"
 #include "reference/gamma.hpp"
 #include "reference/gray.hpp"
