@@ -21,14 +21,15 @@ template <class Packing, class Byte> struct InterleavedImage {
     PYXCC_INLINE auto rowPair(int j) const { return RowPair{row(2 * j), row(2 * j + 1)}; }
 };
 
-template <class Samples, class Byte> struct PlanarImage {
-    std::array<Byte*, 3> first;
-    std::array<std::ptrdiff_t, 3> step;
+template <class Samples, class Byte, int Planes> struct PlanarImage {
+    std::array<Byte*, Planes> first;
+    std::array<std::ptrdiff_t, Planes> step;
 
     PYXCC_INLINE auto row(int y) const
     {
-        const auto plane = [&](int i) PYXCC_INLINE_LAMBDA { return rowAt(first[i], step[i], y); };
-        return PlanarRow<Samples, Byte>{{plane(0)}, {plane(1)}, {plane(2)}};
+        PlanarRow<Samples, Byte, Planes> rows;
+        for (int i = 0; i < Planes; ++i) rows.plane[i] = {rowAt(first[i], step[i], y)};
+        return rows;
     }
 };
 
@@ -76,11 +77,29 @@ template <int PixelSamples, class Sample> auto asItLies(Sample* first, std::ptrd
     return detail::interleaved(first, step, AsTheyLie<detail::RegisterOf<Sample>, PixelSamples>{});
 }
 
+namespace detail
+{
+
+template <int Planes, class Sample> auto planes(Sample* const first[], std::ptrdiff_t step)
+{
+    PlanarImage<RegisterOf<Sample>, ByteOf<Sample>, Planes> image;
+    for (int i = 0; i < Planes; ++i) image.first[i] = bytes(first[i]);
+    image.step.fill(step);
+    return image;
+}
+
+} // namespace detail
+
 /// Three planes with one step.
 template <class Sample> auto p3(Sample* const planes[3], std::ptrdiff_t step)
 {
-    return PlanarImage<detail::RegisterOf<Sample>, detail::ByteOf<Sample>>{
-        {bytes(planes[0]), bytes(planes[1]), bytes(planes[2])}, {step, step, step}};
+    return detail::planes<3>(planes, step);
+}
+
+/// Four planes with one step.
+template <class Sample> auto p4(Sample* const planes[4], std::ptrdiff_t step)
+{
+    return detail::planes<4>(planes, step);
 }
 
 /// The same image with its channels in reverse order, B G R for R G B.

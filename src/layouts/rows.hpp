@@ -9,6 +9,8 @@
 #include "layouts/avx2/interleave.hpp"
 #include "layouts/bytes.hpp"
 
+#include <array>
+
 namespace pyxcc::layouts
 {
 
@@ -178,30 +180,46 @@ private:
     PYXCC_INLINE Byte* sample(int x) const { return at + static_cast<std::ptrdiff_t>(x) * sampleBytes<Samples>; }
 };
 
-/// A row of each of three planes of samples, all of one width.
-template <class Samples, class Byte> struct PlanarRow {
+/// A row of each of three planes of samples, all of one width, or of four.
+template <class Samples, class Byte, int Planes> struct PlanarRow {
+    static_assert(Planes == 3 || Planes == 4);
     static constexpr int block = Samples::count;
-    SampleRow<Samples, Byte> a, b, c;
+    std::array<SampleRow<Samples, Byte>, Planes> plane;
 
-    PYXCC_INLINE Three<Samples> load(int x) const { return {a.load(x), b.load(x), c.load(x)}; }
-
-    PYXCC_INLINE Three<Samples> load(int x, int count) const
+    PYXCC_INLINE auto load(int x) const
     {
-        return {a.load(x, count), b.load(x, count), c.load(x, count)};
+        return group([x](const auto& row) PYXCC_INLINE_LAMBDA { return row.load(x); });
     }
 
-    PYXCC_INLINE void store(int x, const Three<Samples>& pixels) const
+    PYXCC_INLINE auto load(int x, int count) const
     {
-        a.store(x, pixels.a);
-        b.store(x, pixels.b);
-        c.store(x, pixels.c);
+        return group([x, count](const auto& row) PYXCC_INLINE_LAMBDA { return row.load(x, count); });
     }
 
-    PYXCC_INLINE void store(int x, int count, const Three<Samples>& pixels) const
+    template <class Pixels> PYXCC_INLINE void store(int x, const Pixels& pixels) const
     {
-        a.store(x, count, pixels.a);
-        b.store(x, count, pixels.b);
-        c.store(x, count, pixels.c);
+        plane[0].store(x, pixels.a);
+        plane[1].store(x, pixels.b);
+        plane[2].store(x, pixels.c);
+        if constexpr (Planes == 4) plane[3].store(x, pixels.d);
+    }
+
+    template <class Pixels> PYXCC_INLINE void store(int x, int count, const Pixels& pixels) const
+    {
+        plane[0].store(x, count, pixels.a);
+        plane[1].store(x, count, pixels.b);
+        plane[2].store(x, count, pixels.c);
+        if constexpr (Planes == 4) plane[3].store(x, count, pixels.d);
+    }
+
+private:
+    template <class OfRow> PYXCC_INLINE auto group(const OfRow& ofRow) const
+    {
+        if constexpr (Planes == 4) {
+            return Four<Samples>{ofRow(plane[0]), ofRow(plane[1]), ofRow(plane[2]), ofRow(plane[3])};
+        } else {
+            return Three<Samples>{ofRow(plane[0]), ofRow(plane[1]), ofRow(plane[2])};
+        }
     }
 };
 

@@ -51,6 +51,10 @@ struct InP3 {
     static constexpr int planes = 3, samples = 1, takingPart = 3;
     template <class Sample> static auto image(Sample* const* first) { return layouts::p3(first, 0); }
 };
+struct InP4 {
+    static constexpr int planes = 4, samples = 1, takingPart = 4;
+    template <class Sample> static auto image(Sample* const* first) { return layouts::p4(first, 0); }
+};
 
 /// Where and how far from a multiple of 64 a row lies: at guard pages, and off every alignment within margins.
 struct Place {
@@ -231,6 +235,8 @@ TYPED_TEST(Rows, AC4OfAnyOrder) { expectPixelsKeptTogether<TypeParam, InAC4OfAny
 TYPED_TEST(Rows, C4OfAnyOrder) { expectPixelsKeptTogether<TypeParam, InC4OfAnyOrder>(); }
 TYPED_TEST(Rows, P3Loads) { BlocksOf<TypeParam, InP3>::expectLoads(); }
 TYPED_TEST(Rows, P3Stores) { BlocksOf<TypeParam, InP3>::expectStores(); }
+TYPED_TEST(Rows, P4Loads) { BlocksOf<TypeParam, InP4>::expectLoads(); }
+TYPED_TEST(Rows, P4Stores) { BlocksOf<TypeParam, InP4>::expectStores(); }
 
 /// The fourth channel set is the fourth channel stored.
 TYPED_TEST(Rows, C4StoresSetTheFourth)
