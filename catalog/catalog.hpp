@@ -26,6 +26,7 @@ enum class Family {
     colorTwist,
     gamma,
     rgbYCbCr,
+    rgbYuv,
     rgbToSubsampled,
     subsampledToRgb,
     bt709,
@@ -57,7 +58,7 @@ enum class Check { pointers, elements, size, steps, parameters };
 std::span<const Check> checksOf(Order order);
 
 /// Pointers that an export does not test, so that a null one must not be passed.
-enum class Untested { none, sourceArray, targetArray };
+enum class Untested { none, sourceArray, targetArray, targetAlpha }; ///< targetAlpha: the element of the fourth plane
 
 /// The chroma block: when the size is not a multiple of it, the work is done and pyxWarnOddSize comes back.
 struct Warning {

@@ -17,6 +17,8 @@ constexpr FamilyInfo table[] = {
      "two bounds."},
     {Family::rgbYCbCr, "rgb-ycbcr", "RGB and YCbCr at full resolution",
      "8-bit RGB to BT.601 studio-range YCbCr and back, one chroma sample a pixel."},
+    {Family::rgbYuv, "rgb-yuv", "RGB and YUV at full resolution",
+     "8-bit RGB to full-range YUV and back, one chroma sample a pixel."},
     {Family::rgbToSubsampled, "rgb-to-subsampled", "RGB to subsampled YCbCr",
      "8-bit RGB to BT.601 studio-range YCbCr 4:2:0, 4:2:2 and 4:1:1: planar, semi-planar or packed."},
     {Family::subsampledToRgb, "subsampled-to-rgb", "Subsampled YCbCr to RGB",

@@ -158,6 +158,7 @@ std::string orderWords(const catalog::Export& entry)
     std::string text = joined(words, ", ");
     if (entry.traits.untested == catalog::Untested::sourceArray) text += "; the source's array of planes is not tested";
     if (entry.traits.untested == catalog::Untested::targetArray) text += "; the target's array of planes is not tested";
+    if (entry.traits.untested == catalog::Untested::targetAlpha) text += "; the target's plane of alpha is not tested";
     return text;
 }
 

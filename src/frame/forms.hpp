@@ -27,4 +27,17 @@ template <std::derived_from<OnWords> Form> PYXCC_INLINE auto apply(const Form& f
     return narrowAll(form(a.a, b.a, c.a), form(a.b, b.b, c.b));
 }
 
+/// A form over three samples of pixels of four, the fourth of which goes along as it is.
+template <class Form> struct WithFourth {
+    Form form;
+};
+
+template <class Form> constexpr auto withFourth(Form form) { return WithFourth<Form>{form}; }
+
+template <class Form, class Samples> PYXCC_INLINE auto apply(const WithFourth<Form>& form, const Four<Samples>& pixels)
+{
+    const Three<Samples> result = apply(form.form, Three<Samples>{pixels.a, pixels.b, pixels.c});
+    return Four<Samples>{result.a, result.b, result.c, pixels.d};
+}
+
 } // namespace pyxcc::frame

@@ -74,8 +74,11 @@ inline S16 mulRound15(S16 x, int k) { return (x.v * k + 16384) >> 15; }
 inline S16 mulHighS16(S16 x, int k) { return (x.v * k) >> 16; }
 inline U16 mulHighU16(U16 x, int k) { return static_cast<int>((static_cast<u32>(x.v) * static_cast<u32>(k)) >> 16); }
 
-/// mulHighS16(128 (x - Zero), Weight): what a sample adds in the high-product forms.
-template <int Zero, int Weight> S16 highShare(S16 x) { return mulHighS16((x - Zero) << 7, Weight); }
+/// mulHighS16((x - Zero) << Bits, Weight): what a sample adds in the high-product forms.
+template <int Zero, int Weight, int Bits = 7> S16 highShare(S16 x) { return mulHighS16((x - Zero) << Bits, Weight); }
+
+/// (Weight (x - Zero) + Addend) >> 16 with an exact product: what a sample adds in the exact forms.
+template <int Zero, int Weight, int Addend> S16 exactShare(S16 x) { return (Weight * (x.v - Zero) + Addend) >> 16; }
 
 /// (x + half) >> Shift, half being half a step of the result.
 template <int Shift> S16 roundedShift(S16 x) { return (x.v + (1 << (Shift - 1))) >> Shift; }
@@ -89,6 +92,9 @@ template <int Shift, int Addend, int... Weights, class... Lanes> S16 exactSum(co
 {
     return (Addend + ... + (Weights * lanes.v)) >> Shift;
 }
+
+/// (Weight x) >> Shift with an exact product.
+template <int Shift, int Weight> S16 scaledDown(S16 x) { return (Weight * x.v) >> Shift; }
 
 inline F32 fused(F32 x, F32 y, F32 z) { return std::fma(x.v, y.v, z.v); }
 inline F64 fused(F64 x, F64 y, F64 z) { return std::fma(x.v, y.v, z.v); }

@@ -36,9 +36,16 @@ template <int Zero, int Weight> struct HighLuma {
     template <class Word> static PYXCC_INLINE auto scaled(const Word& Y) { return highShare<Zero, Weight>(Y); }
 };
 
-/// Luma of full range, in sixteenths.
-struct LumaSixteenths {
-    template <class Word> static PYXCC_INLINE auto scaled(const Word& Y) { return Y << 4; }
+/// Luma of full range, in 1 << Bits parts of a step.
+template <int Bits> struct WholeLuma {
+    template <class Word> static PYXCC_INLINE auto scaled(const Word& Y)
+    {
+        if constexpr (Bits == 0) {
+            return Y;
+        } else {
+            return Y << Bits;
+        }
+    }
 };
 
 /// Weights of the high products; those of G are taken as the form below has them, added or taken off.
@@ -46,12 +53,13 @@ struct HighWeights {
     int crToR, cbToG, crToG, cbToB;
 };
 
-/// What chroma adds.
-template <HighWeights k> struct ChromaAdded {
+/// What chroma adds, taken `1 << Bits` times as large into the products.
+template <HighWeights k, int Bits = 7> struct ChromaAdded {
     template <class Word> static PYXCC_INLINE auto shares(const Word& Cb, const Word& Cr)
     {
-        return Three{highShare<128, k.crToR>(Cr), highShare<128, k.crToG>(Cr) + highShare<128, k.cbToG>(Cb),
-                     highShare<128, k.cbToB>(Cb)};
+        return Three{highShare<128, k.crToR, Bits>(Cr),
+                     highShare<128, k.crToG, Bits>(Cr) + highShare<128, k.cbToG, Bits>(Cb),
+                     highShare<128, k.cbToB, Bits>(Cb)};
     }
 };
 
@@ -75,6 +83,16 @@ template <HighWeights k, Three<int> Offsets> struct ChromaOffset {
     }
 };
 
+/// Exact sums, of which whole steps of luma take no part: what is added is that to the channels.
+template <HighWeights k, Three<int> Addends> struct ChromaExactly {
+    template <class Word> static PYXCC_INLINE auto shares(const Word& Cb, const Word& Cr)
+    {
+        return Three{exactShare<128, k.crToR, Addends.a>(Cr),
+                     exactSum<16, Addends.b, k.cbToG, k.crToG>(Cb - 128, Cr - 128),
+                     exactShare<128, k.cbToB, Addends.c>(Cb)};
+    }
+};
+
 template <class Luma, class Chroma, int Rounding, int Shift> struct InvHigh : frame::OnWords, Chroma {
     template <class Word, class Share> static PYXCC_INLINE auto add(const Word& Y, const Three<Share>& chroma)
     {
@@ -90,7 +108,9 @@ template <class Luma, class Chroma, int Rounding, int Shift> struct InvHigh : fr
 private:
     template <class Sum> static PYXCC_INLINE auto rounded(const Sum& sum)
     {
-        if constexpr (Rounding == 1 << (Shift - 1)) {
+        if constexpr (Shift == 0) {
+            return sat8(sum);
+        } else if constexpr (Rounding == 1 << (Shift - 1)) {
             return sat8(roundedShift<Shift>(sum));
         } else {
             return sat8((sum + Rounding) >> Shift);

@@ -35,6 +35,7 @@ struct Role {
     std::array<int, 4> Invocation::*steps;
     bool Invocation::*arrayNull;
     bool arrayTested;
+    int planesTested;
 };
 
 void addPointers(Faults& faults, const Side& side, const Role& role)
@@ -42,7 +43,7 @@ void addPointers(Faults& faults, const Side& side, const Role& role)
     if (side.arrangement == Arrangement::planar && role.arrayTested) {
         faults.push_back({role.name + " array null", [=](Invocation& call) { call.*role.arrayNull = true; }});
     }
-    for (int i = 0; i < side.planes; ++i) {
+    for (int i = 0; i < role.planesTested; ++i) {
         faults.push_back({role.name + " plane " + std::to_string(i) + " null",
                           [=](Invocation& call) { (call.*role.planes)[i] = nullptr; }});
     }
@@ -96,10 +97,18 @@ void addParameters(Faults& faults, const Export& entry)
 Faults faultsOf(const Export& entry)
 {
     const catalog::Traits& traits = entry.traits;
-    const Role source{"source", &Invocation::source, &Invocation::sourceStep, &Invocation::sourceArrayNull,
-                      traits.untested != catalog::Untested::sourceArray};
-    const Role target{"target", &Invocation::target, &Invocation::targetStep, &Invocation::targetArrayNull,
-                      traits.untested != catalog::Untested::targetArray};
+    const Role source{"source",
+                      &Invocation::source,
+                      &Invocation::sourceStep,
+                      &Invocation::sourceArrayNull,
+                      traits.untested != catalog::Untested::sourceArray,
+                      entry.source.planes};
+    const Role target{"target",
+                      &Invocation::target,
+                      &Invocation::targetStep,
+                      &Invocation::targetArrayNull,
+                      traits.untested != catalog::Untested::targetArray,
+                      entry.target.planes - (traits.untested == catalog::Untested::targetAlpha ? 1 : 0)};
     Faults faults;
     addPointers(faults, entry.source, source);
     if (traits.stepsTested) addSteps(faults, entry.source, source);

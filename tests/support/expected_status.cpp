@@ -43,7 +43,8 @@ PyxStatus checkPointers(const Export& entry, const Invocation& call)
 PyxStatus checkElements(const Export& entry, const Invocation& call)
 {
     const bool source = isArray(entry.source) && anyNull(first(call.source, entry.source.planes));
-    const bool target = isArray(entry.target) && !entry.inPlace && anyNull(first(call.target, entry.target.planes));
+    const int tested = entry.target.planes - (entry.traits.untested == Untested::targetAlpha ? 1 : 0);
+    const bool target = isArray(entry.target) && !entry.inPlace && anyNull(first(call.target, tested));
     return source || target ? pyxErrNullPtr : pyxOk;
 }
 

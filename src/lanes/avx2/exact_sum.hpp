@@ -106,4 +106,47 @@ template <int Shift, int Addend, int... Weights, class... Lanes> PYXCC_INLINE S1
     return result;
 }
 
+/// (Weight x) >> Shift for a weight of 16 bits, signed or not, and a shift of 16 or more: the upper half of the product
+/// is all that is needed.
+template <int Shift, int Weight> PYXCC_INLINE S16 scaledDown(const S16& x)
+{
+    static_assert(Shift >= 16 && Weight > -32768 && Weight < 65536);
+    constexpr detail::SplitWeight weight(Weight, 16);
+    S16 high = mulHighS16(x, weight.rest);
+    detail::addWhole<16, Weight>(high, x);
+    return Shift == 16 ? high : high >> (Shift - 16);
+}
+
+namespace detail
+{
+
+/// Whether half the weight, rounded down, gives the rounded products of a sample: what is lost shows nowhere.
+template <int Zero, int Weight>
+constexpr bool halfServes = [] {
+    for (int x = -Zero; x < 256 - Zero; ++x) {
+        if ((x * (Weight >> 1) + 0x4000) >> 15 != (x * Weight + 0x8000) >> 16) return false;
+    }
+    return true;
+}();
+
+} // namespace detail
+
+/// (Weight (x - Zero) + Addend) >> 16 with an exact product, in words where the addend allows.
+template <int Zero, int Weight, int Addend> PYXCC_INLINE S16 exactShare(const Sample& x)
+{
+    const S16 fromZero = x - Zero;
+    constexpr detail::SplitWeight weight(Weight, 16);
+    if constexpr (Addend == 0) {
+        S16 result = mulHighS16(fromZero, weight.rest);
+        detail::addWhole<16, Weight>(result, fromZero);
+        return result;
+    } else if constexpr (Addend == 0x8000 && detail::halfServes<Zero, weight.rest>) {
+        S16 result = mulRound15(fromZero, weight.rest >> 1);
+        detail::addWhole<16, Weight>(result, fromZero);
+        return result;
+    } else {
+        return exactSum<16, Addend, Weight>(fromZero);
+    }
+}
+
 } // namespace pyxcc::wide

@@ -129,14 +129,16 @@ struct Sample : S16 {
     }
 };
 
-/// Unsigned products serve where they come to the same: Weight is even, and what they give for Zero is whole.
-template <int Zero, int Weight> PYXCC_INLINE S16 highShare(const Sample& x)
+/// Unsigned products serve where they come to the same: the weight takes up what 256 times are too large, and what they
+/// give for Zero is whole.
+template <int Zero, int Weight, int Bits = 7> PYXCC_INLINE S16 highShare(const Sample& x)
 {
-    constexpr int atZero = 128 * Zero * Weight;
-    if constexpr (Weight > 0 && Weight % 2 == 0 && atZero % 65536 == 0) {
-        return asS16(mulHighU16(x.in256ths, Weight / 2)) - atZero / 65536;
+    constexpr int excess = 1 << (8 - Bits);
+    constexpr int atZero = (Zero << Bits) * Weight;
+    if constexpr (Weight > 0 && Weight % excess == 0 && atZero % 65536 == 0) {
+        return asS16(mulHighU16(x.in256ths, Weight / excess)) - atZero / 65536;
     } else {
-        return mulHighS16((x << 7) - 128 * Zero, Weight);
+        return mulHighS16((x << Bits) - (Zero << Bits), Weight);
     }
 }
 
