@@ -14,6 +14,8 @@
 #include "reference/lab.hpp"
 #include "reference/luv.hpp"
 #include "reference/packed_rgb.hpp"
+#include "reference/reduce_bits.hpp"
+#include "reference/reduce_bits_1u.hpp"
 #include "reference/repack.hpp"
 #include "reference/rgb_to_subsampled.hpp"
 #include "reference/rgb_ycbcr.hpp"
