@@ -81,6 +81,7 @@ Export describe(std::string_view name, PyxStatus(PYXCC_CALL* function)(A...), Fa
     entry.source.chromaUp = traits.sourceChromaUp;
     entry.target.chromaUp = traits.targetChromaUp;
     entry.source.byteInFront = traits.sourceByteInFront;
+    entry.source.evenStep = entry.target.evenStep = traits.evenSteps;
     readSignature<A...>(entry);
     entry.function = reinterpret_cast<Function>(function);
     entry.invoke = naming.inPlace ? &detail::invoke<true, A...> : &detail::invoke<false, A...>;

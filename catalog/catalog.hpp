@@ -25,6 +25,7 @@ std::string_view nameOf(Element element);
 enum class Family {
     colorTwist,
     gamma,
+    gray,
     rgbYCbCr,
     rgbYuv,
     rgbToSubsampled,
@@ -83,6 +84,7 @@ struct Parameter {
     std::array<double, 16> standard = {}; ///< a choice that does for most pictures
     PyxStatus status = pyxOk;             ///< what a number outside of them yields; pyxOk if that is not tested
     bool aboveFront = false;              ///< what is tested is that it is above the parameter in front of it
+    bool optional = false;                ///< a null pointer stands for the standard numbers
 };
 
 inline constexpr Parameter aval{"aval", 0, 255, 0, {255}};
@@ -96,6 +98,10 @@ inline constexpr Parameter twist4x4{
 /// Bounds of floats, which the standard samples go up to and some others beyond.
 inline constexpr Parameter vMin{"vMin", -1, 0.25, 0, {0}};
 inline constexpr Parameter vMax{"vMax", 0.5, 2, 0, {1}, pyxErrRange, true};
+
+/// Weights of colours. Those of three bright channels that add up to more than 1 show what is clamped and what wraps.
+inline constexpr Parameter grayWeights{
+    .name = "coeffs", .low = 0, .high = 1, .count = 3, .standard = {0.299, 0.587, 0.114}, .optional = true};
 
 /// What the signature tells of a parameter.
 struct ParameterType {
@@ -124,6 +130,7 @@ struct Traits {
     Range range = {};                         ///< of the source's samples
     double tolerance = 0;                     ///< by which a target sample may be off, where its last bit is left open
     bool followsRounding = false;             ///< an integer result depends on the caller's rounding mode
+    bool evenSteps = false;                   ///< steps count without their low bit
     bool allocates = false;                   ///< takes scratch memory from the core library, for large images at least
 };
 
@@ -148,6 +155,7 @@ struct Side {
     bool chromaUp = false;        ///< a part of such a block has a sample of its own
     bool byteInFront = false;     ///< in front of a row, if that is one pixel wide, is read
     bool spareFourth = false;     ///< AC4: the fourth sample is not read, or keeps its value
+    bool evenStep = false;        ///< a step counts without its low bit
 };
 
 /// The side that a model, a layout token and an element make, as an export's name would.

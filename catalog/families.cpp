@@ -15,6 +15,9 @@ constexpr FamilyInfo table[] = {
     {Family::gamma, "gamma", "Gamma",
      "The transfer curve of video over three channels, and its inverse: 8-bit and 16-bit samples, and floats between "
      "two bounds."},
+    {Family::gray, "gray", "Gray",
+     "RGB to gray with fixed weights or the caller's, gray to RGB, and the luma of packed 4:2:2, in integers and "
+     "floats."},
     {Family::rgbYCbCr, "rgb-ycbcr", "RGB and YCbCr at full resolution",
      "8-bit RGB to BT.601 studio-range YCbCr and back, one chroma sample a pixel."},
     {Family::rgbYuv, "rgb-yuv", "RGB and YUV at full resolution",

@@ -85,6 +85,7 @@ std::string stepWords(const Side& side)
     case Steps::none:
         return "rows end to end";
     case Steps::one:
+        if (side.evenStep) return "a step, without its low bit";
         return side.planes == 1 ? "a step" : "one step for all planes";
     default:
         return "a step for each plane";
@@ -201,6 +202,7 @@ std::string parameterWords(const catalog::Parameter& parameter)
     if (parameter.count > 0) text << parameter.count << " numbers of ";
     text << parameter.low << " to " << parameter.high << "; if not set";
     for (int i = 0; i < std::max(parameter.count, 1); ++i) text << (i == 0 ? " " : ",") << parameter.standard[i];
+    if (parameter.optional) text << ", which a null pointer stands for";
     return text.str();
 }
 

@@ -8,6 +8,7 @@
 #include "pyxcc/bt709.h"
 #include "pyxcc/color_twist.h"
 #include "pyxcc/gamma.h"
+#include "pyxcc/gray.h"
 #include "pyxcc/rgb_to_subsampled.h"
 #include "pyxcc/rgb_ycbcr.h"
 #include "pyxcc/rgb_yuv.h"

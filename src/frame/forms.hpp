@@ -40,4 +40,10 @@ template <class Form, class Samples> PYXCC_INLINE auto apply(const WithFourth<Fo
     return Four<Samples>{result.a, result.b, result.c, pixels.d};
 }
 
+/// The form of conversions that only move samples.
+struct Unchanged {
+};
+
+template <class Pixels> PYXCC_INLINE const Pixels& apply(Unchanged, const Pixels& pixels) { return pixels; }
+
 } // namespace pyxcc::frame

@@ -65,6 +65,10 @@ struct Byte {
 inline U16 asU16(S16 x) { return x.v; }
 inline S16 asS16(U16 x) { return x.v; }
 
+/// 32768 more, and 32768 less.
+inline U16 raised(S16 x) { return x.v + 32768; }
+inline S16 lowered(U16 x) { return x.v - 32768; }
+
 inline Byte sat8(S16 x) { return {static_cast<u8>(std::clamp<int>(x.v, 0, 255))}; }
 inline Byte sat8(U16 x) { return {static_cast<u8>(std::min<int>(x.v, 255))}; }
 template <int Low, int High> Byte clampTo(S16 x) { return {static_cast<u8>(std::clamp<int>(x.v, Low, High))}; }
@@ -95,6 +99,13 @@ template <int Shift, int Addend, int... Weights, class... Lanes> S16 exactSum(co
 
 /// (Weight x) >> Shift with an exact product.
 template <int Shift, int Weight> S16 scaledDown(S16 x) { return (Weight * x.v) >> Shift; }
+
+/// An exact sum with weights of the caller's, for lanes of bytes.
+template <int Shift, int Addend> S16 exactSumBy(const Three<int>& weights, S16 x, S16 y, S16 z)
+{
+    const S32 sum = S32(Addend) + S32(weights.a) * x.v + S32(weights.b) * y.v + S32(weights.c) * z.v;
+    return (sum >> Shift).v;
+}
 
 inline F32 fused(F32 x, F32 y, F32 z) { return std::fma(x.v, y.v, z.v); }
 inline F64 fused(F64 x, F64 y, F64 z) { return std::fma(x.v, y.v, z.v); }

@@ -35,7 +35,8 @@ PyxStatus checkPointers(const Export& entry, const Invocation& call)
         failed = failed || null(entry.target, call.target, call.targetArrayNull, Untested::targetArray);
     }
     for (int i = 0; i < entry.parameterCount; ++i) {
-        failed = failed || (entry.parameterTypes[i].pointer && !call.parameters[i].pointer);
+        const bool needed = entry.parameterTypes[i].pointer && !entry.traits.parameters[i].optional;
+        failed = failed || (needed && !call.parameters[i].pointer);
     }
     return failed ? pyxErrNullPtr : pyxOk;
 }

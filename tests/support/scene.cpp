@@ -65,7 +65,7 @@ std::vector<Geometry> geometriesOf(const Side& side, RoiSize roi, Stride stride,
         const int step = side.steps == Steps::each   ? stepFor(stride, shape.rowBytes, sampleBytes, random)
                          : side.steps == Steps::none ? shape.rowBytes
                                                      : common;
-        geometries.push_back(geometryOf(shape, side.element, step));
+        geometries.push_back(geometryOf(shape, side.element, side.evenStep ? step & ~1 : step));
     }
     if (side.byteInFront && roi.width == 1) --geometries[0].low;
     // Some conversions walk a chroma plane by the step of the other one.
@@ -84,11 +84,13 @@ Image makeImage(const Side& side, const Recipe& recipe, Stride stride, Random& r
     return image;
 }
 
-void hand(const Image& image, std::array<void*, 4>& planes, std::array<int, 4>& steps)
+/// A low bit that does not count is set where the rows are to lie oddly.
+void hand(const Image& image, const Side& side, Stride stride, std::array<void*, 4>& planes, std::array<int, 4>& steps)
 {
+    const bool odd = side.evenStep && (stride == Stride::odd || stride == Stride::oddUp);
     for (std::size_t i = 0; i < image.size(); ++i) {
         planes[i] = image[i].base();
-        steps[i] = image[i].geometry().step;
+        steps[i] = image[i].geometry().step | int{odd};
     }
 }
 
@@ -170,6 +172,7 @@ void Scene::makeParameters(Random& random)
 {
     for (int i = 0; i < entry_.parameterCount; ++i) {
         const catalog::Parameter& parameter = entry_.traits.parameters[i];
+        if (parameter.optional && random.oneIn(5)) continue;
         const catalog::Element element = elementOf(entry_.parameterTypes[i]);
         const catalog::Range limits = limitsOf(element, {parameter.low, parameter.high});
         if (!entry_.parameterTypes[i].pointer) {
@@ -191,8 +194,8 @@ Invocation Scene::invocation(const Image& target) const
 {
     Invocation call;
     call.roi = recipe_.roi;
-    hand(entry_.inPlace ? target : source_, call.source, call.sourceStep);
-    if (!entry_.inPlace) hand(target, call.target, call.targetStep);
+    hand(entry_.inPlace ? target : source_, entry_.source, recipe_.sourceStride, call.source, call.sourceStep);
+    if (!entry_.inPlace) hand(target, entry_.target, recipe_.targetStride, call.target, call.targetStep);
     for (int i = 0; i < entry_.parameterCount; ++i) {
         call.parameters[i].number = numbers_[i];
         call.parameters[i].pointer = lists_[i].empty() ? nullptr : lists_[i][0].base();
@@ -223,7 +226,8 @@ std::string Scene::text() const
     for (int i = 0; i < entry_.parameterCount; ++i) {
         const catalog::Parameter& parameter = entry_.traits.parameters[i];
         text << "\n  " << parameter.name << ":";
-        if (lists_[i].empty()) text << ' ' << numbers_[i];
+        if (lists_[i].empty() && parameter.count > 0) text << " null";
+        if (parameter.count == 0) text << ' ' << numbers_[i];
         for (int k = 0; !lists_[i].empty() && k < parameter.count; ++k) {
             const catalog::Element element = elementOf(entry_.parameterTypes[i]);
             text << ' ' << load(element, lists_[i][0].base() + k * catalog::sizeOf(element));

@@ -47,9 +47,21 @@ struct Sums {
     template <int WeightOfX, int WeightOfY> PYXCC_INLINE void add(const S16& x, const S16& y)
     {
         static_assert(WeightOfX >= -32768 && WeightOfX <= 32767 && WeightOfY >= -32768 && WeightOfY <= 32767);
-        const __m256i weights = _mm256_set1_epi32((WeightOfX & 0xffff) | static_cast<int>(WeightOfY * 0x10000u));
+        add(x, y, WeightOfX, WeightOfY);
+    }
+
+    /// The low 16 bits of the weights count.
+    PYXCC_INLINE void add(const S16& x, const S16& y, int weightOfX, int weightOfY)
+    {
+        const __m256i weights =
+            _mm256_set1_epi32((weightOfX & 0xffff) | static_cast<int>(static_cast<u32>(weightOfY) << 16));
         low = _mm256_add_epi32(low, _mm256_madd_epi16(_mm256_unpacklo_epi16(x.v, y.v), weights));
         high = _mm256_add_epi32(high, _mm256_madd_epi16(_mm256_unpackhi_epi16(x.v, y.v), weights));
+    }
+
+    template <int Shift> PYXCC_INLINE S16 shifted() const
+    {
+        return S16(_mm256_packs_epi32(_mm256_srai_epi32(low, Shift), _mm256_srai_epi32(high, Shift)));
     }
 };
 
@@ -101,7 +113,7 @@ template <int Shift, int Addend, int... Weights, class... Lanes> PYXCC_INLINE S1
     detail::Sums sums{start, start};
     detail::addTerms<Shift, rides ? Addend : 0, Weights...>(sums, lanes...);
     (detail::addExcess<Shift, Weights>(sums, lanes), ...);
-    S16 result(_mm256_packs_epi32(_mm256_srai_epi32(sums.low, Shift), _mm256_srai_epi32(sums.high, Shift)));
+    S16 result = sums.shifted<Shift>();
     (detail::addWhole<Shift, Weights>(result, lanes), ...);
     return result;
 }
@@ -147,6 +159,20 @@ template <int Zero, int Weight, int Addend> PYXCC_INLINE S16 exactShare(const Sa
     } else {
         return exactSum<16, Addend, Weight>(fromZero);
     }
+}
+
+/// An exact sum with weights of the caller's, of which 15 bits go into multiply-adds and the rest adds multiples of the
+/// lanes: lanes of bytes so keep every sum within 32 bits, whatever the weights, and what is kept of it is exact.
+template <int Shift, int Addend>
+PYXCC_INLINE S16 exactSumBy(const Three<int>& weights, const S16& x, const S16& y, const S16& z)
+{
+    static_assert(Shift == 15 && Addend >= 0 && Addend <= 32767);
+    const auto rest = [](int weight) { return weight & 0x7fff; };
+    const auto whole = [](int weight) { return S16(weight >> 15); };
+    detail::Sums sums{_mm256_setzero_si256(), _mm256_setzero_si256()};
+    sums.add(x, y, rest(weights.a), rest(weights.b));
+    sums.add(z, S16(1), rest(weights.c), Addend);
+    return sums.shifted<Shift>() + x * whole(weights.a) + y * whole(weights.b) + z * whole(weights.c);
 }
 
 } // namespace pyxcc::wide

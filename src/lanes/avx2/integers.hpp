@@ -100,6 +100,10 @@ template <int Low, int High> struct ByteWithin : Byte {
 PYXCC_INLINE U16 asU16(S16 x) { return U16(x.v); }
 PYXCC_INLINE S16 asS16(U16 x) { return S16(x.v); }
 
+/// 32768 more, and 32768 less.
+PYXCC_INLINE U16 raised(S16 x) { return U16(_mm256_xor_si256(x.v, S16(-32768).v)); }
+PYXCC_INLINE S16 lowered(U16 x) { return S16(_mm256_xor_si256(x.v, S16(-32768).v)); }
+
 PYXCC_INLINE Byte sat8(S16 x) { return {x.v}; }
 PYXCC_INLINE Byte sat8(U16 x) { return {_mm256_min_epu16(x.v, _mm256_set1_epi16(255))}; }
 template <int Low, int High> PYXCC_INLINE ByteWithin<Low, High> clampTo(S16 x) { return {x.v}; }

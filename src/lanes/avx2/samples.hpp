@@ -29,6 +29,9 @@ template <> struct RegisterFor<s32> {
 template <> struct RegisterFor<f32> {
     using Type = F32;
 };
+template <> struct RegisterFor<f64> {
+    using Type = F64;
+};
 
 } // namespace detail
 

@@ -115,13 +115,6 @@ PYXCC_INLINE wide::U8 joinPairs(const ChromaPairs& x)
     return wide::U8(_mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1));
 }
 
-/// Samples that stand in another order, brought back to that of memory: each four is where loadQuadruples() puts it.
-template <Order order> PYXCC_INLINE wide::U8 inMemoryOrder(wide::U8 x)
-{
-    if constexpr (order == Order::ofMemory) return x;
-    return wide::U8(_mm256_permutevar8x32_epi32(x.v, _mm256_setr_epi32(0, 4, 1, 5, 2, 6, 3, 7)));
-}
-
 namespace detail
 {
 

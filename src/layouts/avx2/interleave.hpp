@@ -1,4 +1,4 @@
-// Between interleaved pixels in memory and a register a channel, for samples of 1, 2 and 4 bytes: a block is as many
+// Between interleaved pixels in memory and a register a channel, for samples of 1, 2, 4 and 8 bytes: a block is as many
 // pixels as a register has samples. Registers here are what they are in memory, 32 bytes.
 #pragma once
 
@@ -35,9 +35,11 @@ template <Stores stores> PYXCC_INLINE void put(u8* p, __m256i v)
 
 template <class Samples> PYXCC_INLINE Samples as(__m256i v) { return Samples(v); }
 template <> PYXCC_INLINE wide::F32 as<wide::F32>(__m256i v) { return wide::F32(_mm256_castsi256_ps(v)); }
+template <> PYXCC_INLINE wide::F64 as<wide::F64>(__m256i v) { return wide::F64(_mm256_castsi256_pd(v)); }
 
 template <class Samples> PYXCC_INLINE __m256i raw(Samples x) { return x.v; }
 PYXCC_INLINE __m256i raw(wide::F32 x) { return _mm256_castps_si256(x.v); }
+PYXCC_INLINE __m256i raw(wide::F64 x) { return _mm256_castpd_si256(x.v); }
 
 using Places = std::array<u8, 16>;
 
@@ -88,7 +90,9 @@ template <int Bytes> struct Thirds {
     /// In each lane, the samples whose place modulo 3 is 0 from x, 1 from y and 2 from z.
     static PYXCC_INLINE __m256i blend(__m256i x, __m256i y, __m256i z)
     {
-        if constexpr (Bytes == 4) {
+        if constexpr (Bytes == 8) {
+            return _mm256_blend_epi32(x, y, 0xcc);
+        } else if constexpr (Bytes == 4) {
             return _mm256_blend_epi32(_mm256_blend_epi32(x, y, 0x22), z, 0x44);
         } else if constexpr (Bytes == 2) {
             return _mm256_blend_epi16(_mm256_blend_epi16(x, y, 0x92), z, 0x24);
@@ -101,7 +105,9 @@ private:
     /// Brings place placeOf(i) to place i.
     template <class PlaceOf> static PYXCC_INLINE __m256i rearrange(PlaceOf placeOf, __m256i x)
     {
-        if constexpr (Bytes == 4) {
+        if constexpr (Bytes == 8) {
+            return placeOf(0) == 0 ? x : _mm256_shuffle_epi32(x, 0x4e);
+        } else if constexpr (Bytes == 4) {
             constexpr int places = placeOf(0) | placeOf(1) << 2 | placeOf(2) << 4 | placeOf(3) << 6;
             return _mm256_shuffle_epi32(x, places);
         } else {
@@ -187,6 +193,21 @@ template <class Samples, Order order = Order::ofMemory> PYXCC_INLINE Four<Sample
             channel(_mm256_unpacklo_epi64(cd0, cd1)), channel(_mm256_unpackhi_epi64(cd0, cd1))};
 }
 
+/// Pixels of four doubles come in the order of memory, which takes no work.
+template <class Samples, Order order = Order::ofMemory>
+requires(sampleBytes<Samples> == 8) PYXCC_INLINE Four<Samples> loadQuadruples(const u8* p)
+{
+    // Half a pixel, and the same half of the next but one.
+    const auto halves = [p](int at) PYXCC_INLINE_LAMBDA {
+        const __m128i low = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + at));
+        const __m128i high = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + at + 64));
+        return _mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1);
+    };
+    const __m256i ab0 = halves(0), cd0 = halves(16), ab1 = halves(32), cd1 = halves(48);
+    return {detail::as<Samples>(_mm256_unpacklo_epi64(ab0, ab1)), detail::as<Samples>(_mm256_unpackhi_epi64(ab0, ab1)),
+            detail::as<Samples>(_mm256_unpacklo_epi64(cd0, cd1)), detail::as<Samples>(_mm256_unpackhi_epi64(cd0, cd1))};
+}
+
 namespace detail
 {
 
@@ -242,6 +263,14 @@ PYXCC_INLINE void storeTriplesOfQuadruples(u8* p, const Three<Samples>& pixels)
     storeButFourths(p + 32, detail::as<Samples>(x.b.v));
     storeButFourths(p + 64, detail::as<Samples>(x.c.v));
     storeButFourths(p + 96, detail::as<Samples>(x.d.v));
+}
+
+/// Samples that stand where loadQuadruples() puts them, brought to the order of memory.
+template <Order order, class Samples> PYXCC_INLINE Samples inMemoryOrder(Samples x)
+{
+    if constexpr (order == Order::ofMemory || sampleBytes<Samples> == 8) return x;
+    const __m256i inOrder = _mm256_setr_epi32(0, 4, 1, 5, 2, 6, 3, 7);
+    return detail::as<Samples>(_mm256_permutevar8x32_epi32(detail::raw(x), inOrder));
 }
 
 template <class Samples = wide::U8> PYXCC_INLINE Samples loadSamples(const u8* p)

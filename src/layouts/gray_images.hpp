@@ -1,0 +1,66 @@
+// Images of one sample a pixel, and of pixels whose channels are one sample.
+#pragma once
+
+#include "layouts/avx2/chroma.hpp"
+#include "layouts/avx2/gray.hpp"
+#include "layouts/images.hpp"
+
+namespace pyxcc::layouts
+{
+
+/// One sample a pixel.
+template <class Register, Order order = Order::ofMemory> struct C1 {
+    using Samples = Register;
+    static constexpr int pixelBytes = sampleBytes<Samples>;
+    static constexpr bool readsTarget = false;
+
+    static PYXCC_INLINE Samples load(const u8* p) { return loadSamples<Samples>(p); }
+    static PYXCC_INLINE void store(u8* p, Samples samples) { storeSamples(p, inMemoryOrder<order>(samples)); }
+};
+
+/// Three samples a pixel, all of them the same.
+template <class Register> struct C3Gray {
+    using Samples = Register;
+    static constexpr int pixelBytes = 3 * sampleBytes<Samples>;
+    static constexpr bool readsTarget = false;
+
+    static PYXCC_INLINE void store(u8* p, Samples samples) { storeThreefold(p, samples); }
+};
+
+/// Four samples a pixel, the fourth set and the others the same.
+template <class Register> struct C4Gray {
+    using Samples = Register;
+    static constexpr int pixelBytes = 4 * sampleBytes<Samples>;
+    static constexpr bool readsTarget = false;
+    Samples fourth;
+
+    PYXCC_INLINE void store(u8* p, Samples samples) const { storeThreefold(p, samples, fourth); }
+};
+
+/// Luma and chroma bytes in turn, of which the luma is taken.
+struct LumaOfC2 {
+    using Samples = wide::U8;
+    static constexpr int pixelBytes = 2;
+
+    static PYXCC_INLINE Samples load(const u8* p) { return loadAlternating(p).a; }
+};
+
+/// A target with an order other than that of memory is for sources that load pixels in it.
+template <Order order = Order::ofMemory, class Sample> auto c1(Sample* first, std::ptrdiff_t step)
+{
+    return detail::interleaved(first, step, C1<detail::RegisterOf<Sample>, order>{});
+}
+
+template <class Sample> auto c3Gray(Sample* first, std::ptrdiff_t step)
+{
+    return detail::interleaved(first, step, C3Gray<detail::RegisterOf<Sample>>{});
+}
+
+template <class Sample> auto c4Gray(Sample* first, std::ptrdiff_t step, Sample fourth)
+{
+    return detail::interleaved(first, step, C4Gray<detail::RegisterOf<Sample>>{fourth});
+}
+
+inline auto lumaOfC2(const u8* first, std::ptrdiff_t step) { return detail::interleaved(first, step, LumaOfC2{}); }
+
+} // namespace pyxcc::layouts
