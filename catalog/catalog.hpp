@@ -31,6 +31,7 @@ enum class Family {
     rgbToSubsampled,
     subsampledToRgb,
     bt709,
+    xyzYcc,
 };
 
 struct FamilyInfo {

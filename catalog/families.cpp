@@ -28,6 +28,8 @@ constexpr FamilyInfo table[] = {
      "8-bit BT.601 studio-range YCbCr 4:2:0, 4:2:2 and 4:1:1, planar, semi-planar or packed, to RGB."},
     {Family::bt709, "bt709", "BT.709",
      "8-bit RGB to YCbCr and back by BT.709, studio range or full range, 4:2:0, packed 4:2:2 or full resolution."},
+    {Family::xyzYcc, "xyz-ycc", "XYZ and YCC",
+     "RGB to CIE XYZ and to YCC, luma and two chroma samples, and back, in 8-bit, 16-bit and float samples."},
 };
 
 } // namespace

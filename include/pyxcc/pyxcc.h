@@ -15,5 +15,6 @@
 #include "pyxcc/subsampled_to_rgb.h"
 #include "pyxcc/types.h"
 #include "pyxcc/version.h"
+#include "pyxcc/xyz_ycc.h"
 
 #endif
