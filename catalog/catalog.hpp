@@ -30,6 +30,7 @@ enum class Family {
     rgbYuv,
     rgbToSubsampled,
     subsampledToRgb,
+    rgbYuvSubsampled,
     bt709,
     xyzYcc,
 };

@@ -26,6 +26,8 @@ constexpr FamilyInfo table[] = {
      "8-bit RGB to BT.601 studio-range YCbCr 4:2:0, 4:2:2 and 4:1:1: planar, semi-planar or packed."},
     {Family::subsampledToRgb, "subsampled-to-rgb", "Subsampled YCbCr to RGB",
      "8-bit BT.601 studio-range YCbCr 4:2:0, 4:2:2 and 4:1:1, planar, semi-planar or packed, to RGB."},
+    {Family::rgbYuvSubsampled, "rgb-yuv-subsampled", "RGB and subsampled YUV",
+     "8-bit RGB to full-range YUV 4:2:0 and 4:2:2 and back, planar or packed, with steps and without."},
     {Family::bt709, "bt709", "BT.709",
      "8-bit RGB to YCbCr and back by BT.709, studio range or full range, 4:2:0, packed 4:2:2 or full resolution."},
     {Family::xyzYcc, "xyz-ycc", "XYZ and YCC",

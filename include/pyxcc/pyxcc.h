@@ -12,6 +12,7 @@
 #include "pyxcc/rgb_to_subsampled.h"
 #include "pyxcc/rgb_ycbcr.h"
 #include "pyxcc/rgb_yuv.h"
+#include "pyxcc/rgb_yuv_subsampled.h"
 #include "pyxcc/subsampled_to_rgb.h"
 #include "pyxcc/types.h"
 #include "pyxcc/version.h"

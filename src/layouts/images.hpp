@@ -31,6 +31,9 @@ template <class Samples, class Byte, int Planes> struct PlanarImage {
         for (int i = 0; i < Planes; ++i) rows.plane[i] = {rowAt(first[i], step[i], y)};
         return rows;
     }
+
+    /// Rows 2 j and 2 j + 1.
+    PYXCC_INLINE auto rowPair(int j) const { return RowPair{row(2 * j), row(2 * j + 1)}; }
 };
 
 namespace detail

@@ -1,7 +1,8 @@
 // Layouts in which neighbouring pixels share their chroma: planes, luma and a plane of chroma pairs, or packed rows.
 //
 // As a target, a partial block ends where its last whole chroma sample does: columns behind it get luma and no chroma.
-// Only a packed row has a place for one chroma sample, the first of the two, beside a last odd pixel.
+// Only a packed row has a place for one chroma sample, the first of the two, beside a last odd pixel; and planes can be
+// such that a part of a block has samples of its own.
 //
 // As a source, every pixel of a partial block has chroma: a pair whose second column is missing has a sample of its own
 // in a plane, three columns or less of a four take the sample of the four before, and in a packed row a last odd pixel
@@ -31,8 +32,11 @@ template <int Columns, class Luma> using ChromaOfSums = SharedChroma<Columns, Lu
 /// What a source gives: chroma as words, a sample for every pair. Samples of fours come twice.
 template <class Luma> using ChromaOfPairs = SharedChroma<2, Luma, Two<wide::Sample>>;
 
+/// Whether columns that do not fill a block have chroma in a target of planes.
+enum class Rest { lumaOnly, withChroma };
+
 /// Rows of two planes of chroma.
-template <int Columns, class Byte, Order Within = Order::ofMemory> struct ChromaPlanesRow {
+template <int Columns, class Byte, Order Within = Order::ofMemory, Rest rest = Rest::lumaOnly> struct ChromaPlanesRow {
     static constexpr int columns = Columns;
     static constexpr Order order = Within;
     Byte *a, *b;
@@ -56,8 +60,9 @@ template <int Columns, class Byte, Order Within = Order::ofMemory> struct Chroma
     {
         u8 bufferA[wide::U8::count / Columns], bufferB[wide::U8::count / Columns];
         storeApart<Columns, order>(bufferA, bufferB, chroma);
-        copyBytes(a + x / Columns, bufferA, count / Columns);
-        copyBytes(b + x / Columns, bufferB, count / Columns);
+        const int samples = (count + (rest == Rest::withChroma ? Columns - 1 : 0)) / Columns;
+        copyBytes(a + x / Columns, bufferA, samples);
+        copyBytes(b + x / Columns, bufferB, samples);
     }
 
 private:
@@ -142,13 +147,13 @@ private:
 template <class LumaRow, class ChromaRow> SharedChromaRow(LumaRow, ChromaRow) -> SharedChromaRow<LumaRow, ChromaRow>;
 
 /// Two planes of chroma, a sample for every `Columns` columns.
-template <int Columns, class Byte, Order order = Order::ofMemory> struct ChromaPlanes {
+template <int Columns, class Byte, Order order = Order::ofMemory, Rest rest = Rest::lumaOnly> struct ChromaPlanes {
     std::array<Byte*, 2> first;
     std::array<std::ptrdiff_t, 2> step;
 
     PYXCC_INLINE auto row(int y) const
     {
-        return ChromaPlanesRow<Columns, Byte, order>{rowAt(first[0], step[0], y), rowAt(first[1], step[1], y)};
+        return ChromaPlanesRow<Columns, Byte, order, rest>{rowAt(first[0], step[0], y), rowAt(first[1], step[1], y)};
     }
 };
 
@@ -200,6 +205,16 @@ template <Order order> struct LumaFirst {
     static PYXCC_INLINE void completeLastPair(u8* end, const u8* row, int width) { end[1] = row[2 * width - 3]; }
 };
 
+/// The same as a source that reads nothing in front of a row: the only pixel of a row has a chroma sample of its own,
+/// and the other one is that of gray.
+struct LumaFirstAlone : LumaFirst<Order::ofMemory> {
+    static PYXCC_INLINE void completeLastPair(u8* end, const u8* row, int width)
+    {
+        if (width > 1) return LumaFirst::completeLastPair(end, row, width);
+        end[1] = 128;
+    }
+};
+
 /// Chroma and luma bytes in turn, chroma first.
 template <Order order> struct ChromaFirst {
     using Samples = wide::U8;
@@ -243,9 +258,10 @@ template <class Packing> struct ChromaExchanged : Packing {
 // Targets with an order other than that of memory are for sources that load pixels in it.
 
 /// Three planes with a step each: luma, and two of chroma with a sample for every `Columns` columns.
-template <int Columns, Order order = Order::ofMemory, class Byte> auto p3(Byte* const planes[3], const int steps[3])
+template <int Columns, Order order = Order::ofMemory, Rest rest = Rest::lumaOnly, class Byte>
+auto p3(Byte* const planes[3], const int steps[3])
 {
-    using Chroma = ChromaPlanes<Columns, Byte, order>;
+    using Chroma = ChromaPlanes<Columns, Byte, order, rest>;
     return SharedChromaImage<Chroma, Byte>{planes[0], steps[0], Chroma{{planes[1], planes[2]}, {steps[1], steps[2]}}};
 }
 
@@ -259,6 +275,12 @@ template <Order order = Order::ofMemory, class Byte> auto p2(Byte* luma, int lum
 template <Order order = Order::ofMemory, class Byte> auto c2LumaFirst(Byte* first, int step)
 {
     return InterleavedImage<LumaFirst<order>, Byte>{first, step, {}};
+}
+
+/// The same for a source, of which nothing in front of a row is read.
+template <class Byte> auto c2LumaFirstAlone(Byte* first, int step)
+{
+    return InterleavedImage<LumaFirstAlone, Byte>{first, step, {}};
 }
 
 /// Packed pairs of pixels: Cb Y0 Cr Y1.

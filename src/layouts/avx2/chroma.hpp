@@ -74,6 +74,9 @@ template <int Columns, class Rows> struct Sums : wide::S16 {
     }
 };
 
+/// Sums of two neighbours, in the order of the sums above, of words in that of widened bytes.
+PYXCC_INLINE wide::S16 sumsOfPairs(const Two<wide::S16>& x) { return wide::S16(_mm256_hadd_epi16(x.a.v, x.b.v)); }
+
 /// Each word twice, in the order of widened bytes: what 16 chroma samples give is laid beside 32 luma samples.
 PYXCC_INLINE Two<wide::S16> doubled(wide::S16 x)
 {
