@@ -113,6 +113,7 @@ std::span<const Check> checksOf(Order order)
     static constexpr Check stepsBeforeSize[] = {pointers, elements, steps, size, parameters};
     static constexpr Check sizeFirst[] = {size, pointers, elements, steps, parameters};
     static constexpr Check parametersFirst[] = {parameters, pointers, elements, size, steps};
+    static constexpr Check sizeTwice[] = {pointers, positiveSize, elements, size, steps, parameters};
     switch (order) {
     case Order::pointersSizeElements:
         return elementsLate;
@@ -122,10 +123,21 @@ std::span<const Check> checksOf(Order order)
         return sizeFirst;
     case Order::parametersFirst:
         return parametersFirst;
+    case Order::sizeTwice:
+        return sizeTwice;
     case Order::pointersElementsSize:
         break;
     }
     return usual;
+}
+
+Beyond beyondBand(double layout, RoiSize roi)
+{
+    const int odd = roi.height & 1; // then the last row to be given is the first of two that share chroma
+    if (layout == 1) return {{0, 0, odd}, {}};
+    if (layout == 4) return {{3, 1, odd}, {2, 1, 0}};
+    if (layout == 16) return {{3, 1, 0}, {2, 1, 0}};
+    return {};
 }
 
 int sizeOf(Element element) { return elements[static_cast<int>(element)].second; }

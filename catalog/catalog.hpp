@@ -33,6 +33,7 @@ enum class Family {
     rgbYuvSubsampled,
     bt709,
     xyzYcc,
+    filterInterlace,
 };
 
 struct FamilyInfo {
@@ -53,10 +54,11 @@ enum class Order {
     stepsBeforeSize, ///< else as the first of these
     sizeFirst,       ///< then as the first of these
     parametersFirst, ///< likewise
+    sizeTwice,       ///< pointers, a size above nothing, elements, the size
 };
 
 /// What an order is made of. Steps and parameters are tested only where the traits say so.
-enum class Check { pointers, elements, size, steps, parameters };
+enum class Check { pointers, elements, positiveSize, size, steps, parameters };
 
 std::span<const Check> checksOf(Order order);
 
@@ -87,6 +89,7 @@ struct Parameter {
     PyxStatus status = pyxOk;             ///< what a number outside of them yields; pyxOk if that is not tested
     bool aboveFront = false;              ///< what is tested is that it is above the parameter in front of it
     bool optional = false;                ///< a null pointer stands for the standard numbers
+    std::span<const int> special = {};    ///< numbers with a meaning of their own, for tests to try
 };
 
 inline constexpr Parameter aval{"aval", 0, 255, 0, {255}};
@@ -104,6 +107,22 @@ inline constexpr Parameter vMax{"vMax", 0.5, 2, 0, {1}, pyxErrRange, true};
 /// Weights of colours. Those of three bright channels that add up to more than 1 show what is clamped and what wraps.
 inline constexpr Parameter grayWeights{
     .name = "coeffs", .low = 0, .high = 1, .count = 3, .standard = {0.299, 0.587, 0.114}, .optional = true};
+
+/// Which band of an image a call is: the whole, some that are none, and the top, the middle and the bottom.
+inline constexpr int bandLayouts[] = {21, 21, 31, -1, 53, 0, 5, 17, 20, 1, 4, 16, 1, 4, 16};
+inline constexpr Parameter bandLayout{.name = "layout", .low = 0, .high = 31, .standard = {21}, .special = bandLayouts};
+
+/// Rows next to the region that a call touches as well.
+struct RowsBeyond {
+    int lumaInFront = 0, chromaInFront = 0, chromaBehind = 0;
+};
+
+struct Beyond {
+    RowsBeyond source, target;
+};
+
+/// Those of a call for a band: two rows and what their filter needs.
+Beyond beyondBand(double layout, RoiSize roi);
 
 /// What the signature tells of a parameter.
 struct ParameterType {
@@ -128,12 +147,13 @@ struct Traits {
     bool stepsTested = false;                 ///< a step below 1 yields pyxErrStep
     bool sourceChromaUp = false;              ///< the source has a chroma sample for a part of a block, too
     bool targetChromaUp = false;              ///< and so has the target
-    bool sourceByteInFront = false;           ///< in front of a row of the source, if that is one pixel wide, is read
+    int sourceByteInFront = 0;                ///< so far in front of a row of the source one pixel wide, a byte is read
     Range range = {};                         ///< of the source's samples
     double tolerance = 0;                     ///< by which a target sample may be off, where its last bit is left open
     bool followsRounding = false;             ///< an integer result depends on the caller's rounding mode
     bool evenSteps = false;                   ///< steps count without their low bit
     bool allocates = false;                   ///< takes scratch memory from the core library, for large images at least
+    Beyond (*beyond)(double, RoiSize) = nullptr; ///< rows outside of the region, by the first parameter
 };
 
 enum class Arrangement {
@@ -155,7 +175,7 @@ struct Side {
     Steps steps = Steps::one;     ///< how the signature gives the steps
     int chromaX = 0, chromaY = 0; ///< chroma is shared by 1 << chromaX columns and 1 << chromaY rows
     bool chromaUp = false;        ///< a part of such a block has a sample of its own
-    bool byteInFront = false;     ///< in front of a row, if that is one pixel wide, is read
+    int byteInFront = 0;          ///< so far in front of a row, if that is one pixel wide, a byte is read
     bool spareFourth = false;     ///< AC4: the fourth sample is not read, or keeps its value
     bool evenStep = false;        ///< a step counts without its low bit
 };

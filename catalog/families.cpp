@@ -32,6 +32,9 @@ constexpr FamilyInfo table[] = {
      "8-bit RGB to YCbCr and back by BT.709, studio range or full range, 4:2:0, packed 4:2:2 or full resolution."},
     {Family::xyzYcc, "xyz-ycc", "XYZ and YCC",
      "RGB to CIE XYZ and to YCC, luma and two chroma samples, and back, in 8-bit, 16-bit and float samples."},
+    {Family::filterInterlace, "filter-interlace", "Filtered and interlaced YCbCr",
+     "8-bit YCbCr 4:2:0 and 4:2:2: chroma filtered along the columns, in whole images or in bands, and the two fields "
+     "of a frame kept apart."},
 };
 
 } // namespace

@@ -145,6 +145,9 @@ std::string orderWords(const catalog::Export& entry)
         case elements:
             if (arrays) words.push_back("null planes");
             break;
+        case positiveSize:
+            words.push_back("a size below 1");
+            break;
         case size:
             words.push_back("size");
             break;

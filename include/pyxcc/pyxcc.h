@@ -7,6 +7,7 @@
 
 #include "pyxcc/bt709.h"
 #include "pyxcc/color_twist.h"
+#include "pyxcc/filter_interlace.h"
 #include "pyxcc/gamma.h"
 #include "pyxcc/gray.h"
 #include "pyxcc/rgb_to_subsampled.h"

@@ -7,6 +7,7 @@
 #include "lanes/avx2/exact_sum.hpp"
 #include "lanes/avx2/floats.hpp"
 #include "lanes/avx2/integers.hpp"
+#include "lanes/avx2/means.hpp"
 #include "lanes/avx2/samples.hpp"
 #include "lanes/scalar.hpp"
 #include "lanes/several.hpp"

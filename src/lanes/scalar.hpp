@@ -91,6 +91,15 @@ inline S16 addSatS16(S16 x, S16 y) { return std::clamp(x.v + y.v, -32768, 32767)
 inline S16 subSatS16(S16 x, S16 y) { return std::clamp(x.v - y.v, -32768, 32767); }
 inline U16 addSatU16(U16 x, U16 y) { return std::min(x.v + y.v, 65535); }
 
+inline U8 avgUp(U8 x, U8 y) { return (x.v + y.v + 1) >> 1; }
+inline U8 avgDown(U8 x, U8 y) { return (x.v + y.v) >> 1; }
+
+/// (Weights * lanes + ... + Addend) >> Shift, clamped to a byte.
+template <int Shift, int Addend, int... Weights, class... Lanes> U8 exactMean(const Lanes&... lanes)
+{
+    return std::clamp((Addend + ... + (Weights * lanes.v)) >> Shift, 0, 255);
+}
+
 /// (Weights * lanes + ... + Addend) >> Shift in 32 bits, of which the low 16 are kept.
 template <int Shift, int Addend, int... Weights, class... Lanes> S16 exactSum(const Lanes&... lanes)
 {

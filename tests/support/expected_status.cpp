@@ -60,6 +60,11 @@ PyxStatus checkSize(const Export& entry, const Invocation& call)
     return good ? pyxOk : pyxErrSize;
 }
 
+PyxStatus checkPositiveSize(const Invocation& call)
+{
+    return call.roi.width >= 1 && call.roi.height >= 1 ? pyxOk : pyxErrSize;
+}
+
 PyxStatus checkSteps(const Export& entry, const Invocation& call)
 {
     if (!entry.traits.stepsTested) return pyxOk;
@@ -91,6 +96,8 @@ PyxStatus check(catalog::Check what, const Export& entry, const Invocation& call
         return checkPointers(entry, call);
     case catalog::Check::elements:
         return checkElements(entry, call);
+    case catalog::Check::positiveSize:
+        return checkPositiveSize(call);
     case catalog::Check::size:
         return checkSize(entry, call);
     case catalog::Check::steps:

@@ -55,7 +55,16 @@ void shareExtent(Geometry& a, Geometry& b)
     a.high = b.high = std::max(a.high, b.high);
 }
 
-std::vector<Geometry> geometriesOf(const Side& side, RoiSize roi, Stride stride, Random& random)
+/// Room for rows in front of the first one and behind the last.
+void addRows(Geometry& geometry, int inFront, int behind)
+{
+    const std::ptrdiff_t step = geometry.step;
+    geometry.low += std::min({-step * inFront, step * behind, std::ptrdiff_t{0}});
+    geometry.high += std::max({-step * inFront, step * behind, std::ptrdiff_t{0}});
+}
+
+std::vector<Geometry> geometriesOf(const Side& side, RoiSize roi, Stride stride, const catalog::RowsBeyond& beyond,
+                                   Random& random)
 {
     const int sampleBytes = catalog::sizeOf(side.element);
     std::vector<Geometry> geometries;
@@ -65,19 +74,23 @@ std::vector<Geometry> geometriesOf(const Side& side, RoiSize roi, Stride stride,
         const int step = side.steps == Steps::each   ? stepFor(stride, shape.rowBytes, sampleBytes, random)
                          : side.steps == Steps::none ? shape.rowBytes
                                                      : common;
-        geometries.push_back(geometryOf(shape, side.element, side.evenStep ? step & ~1 : step));
+        Geometry& geometry =
+            geometries.emplace_back(geometryOf(shape, side.element, side.evenStep ? step & ~1 : step));
+        const bool luma = plane == 0;
+        addRows(geometry, luma ? beyond.lumaInFront : beyond.chromaInFront, luma ? 0 : beyond.chromaBehind);
     }
-    if (side.byteInFront && roi.width == 1) --geometries[0].low;
+    if (roi.width == 1) geometries[0].low -= side.byteInFront;
     // Some conversions walk a chroma plane by the step of the other one.
     if (side.steps == Steps::each && side.planes > 2) shareExtent(geometries[1], geometries[2]);
     return geometries;
 }
 
-Image makeImage(const Side& side, const Recipe& recipe, Stride stride, Random& random)
+Image makeImage(const Side& side, const Recipe& recipe, Stride stride, const catalog::RowsBeyond& beyond,
+                Random& random)
 {
     const int sampleBytes = catalog::sizeOf(side.element);
     Image image;
-    for (const Geometry& geometry : geometriesOf(side, recipe.roi, stride, random)) {
+    for (const Geometry& geometry : geometriesOf(side, recipe.roi, stride, beyond, random)) {
         const int anywhere = random.between(0, 64 / sampleBytes - 1) * sampleBytes;
         image.emplace_back(geometry, recipe.placement, recipe.aligned ? 0 : anywhere);
     }
@@ -150,19 +163,21 @@ RoiSize legalSize(const Export& entry, RoiSize roi)
 Scene::Scene(const Export& entry, const Recipe& recipe) : entry_(entry), recipe_(recipe)
 {
     Random random(recipe.seed);
-    makeImages(random);
     makeParameters(random);
+    makeImages(random);
 }
 
 void Scene::makeImages(Random& random)
 {
-    source_ = makeImage(entry_.source, recipe_, recipe_.sourceStride, random);
+    const auto beyondOf = entry_.traits.beyond;
+    const catalog::Beyond beyond = beyondOf ? beyondOf(numbers_[0], recipe_.roi) : catalog::Beyond{};
+    source_ = makeImage(entry_.source, recipe_, recipe_.sourceStride, beyond.source, random);
     fillSamples(source_, entry_.source, entry_.traits.range, recipe_.pattern, random);
     if (entry_.inPlace) {
         target_ = std::move(source_);
         source_.clear();
     } else {
-        target_ = makeImage(entry_.target, recipe_, recipe_.targetStride, random);
+        target_ = makeImage(entry_.target, recipe_, recipe_.targetStride, beyond.target, random);
         fillBytes(target_, random);
     }
     pristineSource_ = source_;
@@ -176,7 +191,8 @@ void Scene::makeParameters(Random& random)
         const catalog::Element element = elementOf(entry_.parameterTypes[i]);
         const catalog::Range limits = limitsOf(element, {parameter.low, parameter.high});
         if (!entry_.parameterTypes[i].pointer) {
-            numbers_[i] = numberFor(limits, element, random);
+            const bool special = !parameter.special.empty() && !random.oneIn(4);
+            numbers_[i] = special ? random.pick(parameter.special) : numberFor(limits, element, random);
             continue;
         }
         const int bytes = parameter.count * catalog::sizeOf(element);

@@ -19,6 +19,9 @@ using ChromaPairs = Two<HalfBlock>;
 PYXCC_INLINE HalfBlock loadHalf(const u8* p) { return {_mm_loadu_si128(reinterpret_cast<const __m128i*>(p))}; }
 PYXCC_INLINE void storeHalf(u8* p, HalfBlock x) { _mm_storeu_si128(reinterpret_cast<__m128i*>(p), x.v); }
 
+/// (x + y + 1) >> 1.
+PYXCC_INLINE HalfBlock avgUp(HalfBlock x, HalfBlock y) { return {_mm_avg_epu8(x.v, y.v)}; }
+
 /// As words, in order.
 PYXCC_INLINE wide::Sample widen(HalfBlock x)
 {
