@@ -140,6 +140,12 @@ Beyond beyondBand(double layout, RoiSize roi)
     return {};
 }
 
+Beyond beyondTwoRows(double, RoiSize roi)
+{
+    if (roi.height == 2) return {{0, 0, 1}, {0, 0, 2}};
+    return {};
+}
+
 int sizeOf(Element element) { return elements[static_cast<int>(element)].second; }
 
 std::string_view nameOf(Element element) { return elements[static_cast<int>(element)].first; }

@@ -26,6 +26,7 @@ enum class Family {
     colorTwist,
     gamma,
     gray,
+    repack,
     rgbYCbCr,
     rgbYuv,
     rgbToSubsampled,
@@ -123,6 +124,9 @@ struct Beyond {
 
 /// Those of a call for a band: two rows and what their filter needs.
 Beyond beyondBand(double layout, RoiSize roi);
+
+/// Those of a call that makes four rows of chroma at the least, by two rows of the source.
+Beyond beyondTwoRows(double, RoiSize roi);
 
 /// What the signature tells of a parameter.
 struct ParameterType {

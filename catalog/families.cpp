@@ -18,6 +18,9 @@ constexpr FamilyInfo table[] = {
     {Family::gray, "gray", "Gray",
      "RGB to gray with fixed weights or the caller's, gray to RGB, and the luma of packed 4:2:2, in integers and "
      "floats."},
+    {Family::repack, "repack", "Chroma repacking and resampling",
+     "8-bit YCbCr 4:2:0, 4:2:2, 4:1:1 and 1620 from one chroma form and plane layout to another; samples are moved, "
+     "doubled or dropped, and averaged in four of them."},
     {Family::rgbYCbCr, "rgb-ycbcr", "RGB and YCbCr at full resolution",
      "8-bit RGB to BT.601 studio-range YCbCr and back, one chroma sample a pixel."},
     {Family::rgbYuv, "rgb-yuv", "RGB and YUV at full resolution",

@@ -10,6 +10,7 @@
 #include "pyxcc/filter_interlace.h"
 #include "pyxcc/gamma.h"
 #include "pyxcc/gray.h"
+#include "pyxcc/repack.h"
 #include "pyxcc/rgb_to_subsampled.h"
 #include "pyxcc/rgb_ycbcr.h"
 #include "pyxcc/rgb_yuv.h"

@@ -32,6 +32,15 @@ inline auto sizeAtLeast(RoiSize roi, int width, int height)
     return [=]() -> PyxStatus { return roi.width >= width && roi.height >= height ? pyxOk : pyxErrSize; };
 }
 
+/// At least one block of `width` by `height` pixels, and whole ones only.
+inline auto wholeBlocks(RoiSize roi, int width, int height)
+{
+    return [=]() -> PyxStatus {
+        const bool whole = roi.width % width == 0 && roi.height % height == 0;
+        return roi.width >= width && roi.height >= height && whole ? pyxOk : pyxErrSize;
+    };
+}
+
 template <class... Step> auto stepsAtLeast1(Step... steps)
 {
     return [=]() -> PyxStatus { return ((steps >= 1) && ...) ? pyxOk : pyxErrStep; };

@@ -16,14 +16,16 @@ template <class Byte> PYXCC_INLINE Byte* rowAt(Byte* first, std::ptrdiff_t step,
 template <class T> PYXCC_INLINE const u8* bytes(const T* samples) { return reinterpret_cast<const u8*>(samples); }
 template <class T> PYXCC_INLINE u8* bytes(T* samples) { return reinterpret_cast<u8*>(samples); }
 
-/// Hints at the two cache lines some distance behind `p`. Interleaved rows go through memory fast, and those that share
-/// a loop with other rows outrun the processor's own look-ahead. A hint neither reads nor faults, so that it may reach
-/// behind the last row.
-template <int Distance> PYXCC_INLINE void expectFrom(const u8* p)
+/// Hints at cache lines some distance behind `p`. Interleaved rows go through memory fast, and those that share a loop
+/// with other rows outrun the processor's own look-ahead. A hint neither reads nor faults, so that it may reach behind
+/// the last row.
+template <int Distance, int Lines = 2> PYXCC_INLINE void expectFrom(const u8* p)
 {
-    __builtin_prefetch(p + Distance);
-    __builtin_prefetch(p + Distance + 64);
+    for (int i = 0; i < Lines; ++i) __builtin_prefetch(p + Distance + 64 * i);
 }
+
+/// How far ahead of its loads and of its stores a loop hints that does hardly more than copy.
+inline constexpr int expectedLoads = 4096, expectedStores = 2048;
 
 /// Copies a partial block: few bytes, where a call of memcpy would cost more than the copy.
 void copyBytes(u8* to, const u8* from, int count);

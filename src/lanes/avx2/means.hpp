@@ -3,6 +3,8 @@
 
 #include "lanes/avx2/integers.hpp"
 
+#include <algorithm>
+
 namespace pyxcc::wide
 {
 
@@ -56,6 +58,16 @@ template <int Shift, int Addend> PYXCC_INLINE Byte shifted(S16 sum)
 
 /// (x + y) >> 1.
 PYXCC_INLINE U8 avgDown(U8 x, U8 y) { return detail::complement(detail::complementOfMean<1, 1>(x, y)); }
+
+/// avgUp() in the first `lanes` lanes, avgDown() in the others.
+PYXCC_INLINE U8 avgUpBelow(int lanes, U8 x, U8 y)
+{
+    const __m256i lane = _mm256_setr_epi8(0, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12, 13, 14, 15, 16, 17, 18, 19, 20, 21,
+                                          22, 23, 24, 25, 26, 27, 28, 29, 30, 31);
+    const __m256i up = _mm256_cmpgt_epi8(_mm256_set1_epi8(static_cast<char>(std::clamp(lanes, 0, U8::count))), lane);
+    const __m256i odd = _mm256_and_si256(_mm256_xor_si256(x.v, y.v), _mm256_set1_epi8(1));
+    return U8(_mm256_sub_epi8(avgUp(x, y).v, _mm256_andnot_si256(up, odd)));
+}
 
 /// (Weights * lanes + ... + Addend) >> Shift of an even number of lanes, clamped to a byte. The weights are bytes with
 /// a sign, and no sum leaves 16 bits.
