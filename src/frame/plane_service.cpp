@@ -46,15 +46,25 @@ std::size_t toNextLine(const u8* p, std::size_t count)
     return std::min((line - reinterpret_cast<std::uintptr_t>(p) % line) % line, count);
 }
 
-void streamRow(const u8* src, u8* dst, std::size_t count)
+enum class Way { throughCache, pastCache };
+
+/// By whole lines of the target. A plane goes through memory faster than the processor's own look-ahead expects.
+template <Way way> void copyRow(const u8* src, u8* dst, std::size_t count)
 {
     const std::size_t head = toNextLine(dst, count);
     std::memcpy(dst, src, head);
     std::size_t x = head;
     for (; count - x >= line; x += line) {
         const wide::U8 first = layouts::loadSamples(src + x), second = layouts::loadSamples(src + x + line / 2);
-        layouts::streamSamples(dst + x, first);
-        layouts::streamSamples(dst + x + line / 2, second);
+        if constexpr (way == Way::pastCache) {
+            layouts::streamSamples(dst + x, first);
+            layouts::streamSamples(dst + x + line / 2, second);
+        } else {
+            layouts::expectFrom<layouts::expectedLoads, 1>(src + x);
+            layouts::expectFrom<layouts::expectedStores, 1>(dst + x);
+            layouts::storeSamples(dst + x, first);
+            layouts::storeSamples(dst + x + line / 2, second);
+        }
     }
     std::memcpy(dst + x, src + x, count - x);
 }
@@ -88,9 +98,9 @@ PyxStatus copyPlane8u(const u8* src, int srcStep, u8* dst, int dstStep, int widt
         const u8* from = rowAt(src, srcStep, y);
         u8* to = rowAt(dst, dstStep, y);
         if (stream) {
-            streamRow(from, to, rows.bytes);
+            copyRow<Way::pastCache>(from, to, rows.bytes);
         } else {
-            std::memcpy(to, from, rows.bytes);
+            copyRow<Way::throughCache>(from, to, rows.bytes);
         }
     }
     if (stream) layouts::fenceStreams();

@@ -82,20 +82,18 @@ struct ByTurnsToTwoRows {
 template <class Block, class Source, class Target>
 void takePart(int samples, const Source& source, const Target& target)
 {
-    constexpr int planes = 6, sampleBytes = 4;
-    struct Buffers {
-        alignas(32) u8 bytes[planes][2 * blockSamples * sampleBytes] = {};
-    };
-    Buffers from, to;
-    u8(*next)[2 * blockSamples * sampleBytes] = from.bytes;
+    constexpr int mostRows = 4, mostBytes = 4; // two rows of two planes; a packed sample
+    using Buffer = u8[2 * blockSamples * mostBytes];
+    alignas(32) Buffer from[mostRows] = {}, to[mostRows];
+    Buffer* next = from;
     const auto copiedSource = source.mapped([&](const u8* row, int bytes) {
         layouts::copyBytes(*next, row, samples * Block::sourceSamples * bytes);
         return *next++;
     });
-    next = to.bytes;
+    next = to;
     const auto copiedTarget = target.mapped([&](u8*, int) { return *next++; });
     Block::take(0, copiedSource, copiedTarget);
-    next = to.bytes;
+    next = to;
     target.mapped([&](u8* row, int bytes) {
         layouts::copyBytes(row, *next++, samples * Block::targetSamples * bytes);
         return row;
@@ -152,7 +150,7 @@ struct RowDouble : IndexRule<2, 2, 2, 2> {
 
 /// rowDouble into planes, whose second copies come to lie elsewhere: in the third plane a part of each, samples of
 /// whole eights behind the last whole `WideBlock`, is as far behind the first copy as rows of the second plane are
-/// apart. Where the copies of a row overlap, the second one counts.
+/// apart. The whole of the first copy is made before the second, which counts where they overlap.
 template <int WideBlock> struct RowDoubleMisplaced : IndexRule<2, 2, 2, 2> {
     template <class Source, class Target>
     static void step(int j, int samples, const Source& source, const Target& target)
@@ -161,8 +159,9 @@ template <int WideBlock> struct RowDoubleMisplaced : IndexRule<2, 2, 2, 2> {
         const auto first = target.row(2 * j, 2 * j), second = target.row(2 * j + 1, 2 * j + 1);
         auto misplaced = second;
         misplaced.b = first.b + target.image.step[1];
-        const int wide = samples & ~(WideBlock - 1), eights = samples & ~7;
         takeRow<AsItIs>(samples, from, first);
+        if (misplaced.b == second.b) return takeRow<AsItIs>(samples, from, second);
+        const int wide = samples & ~(WideBlock - 1), eights = samples & ~7;
         takePiece(0, wide, from, second);
         takePiece(wide, eights, from, misplaced);
         takePiece(eights, samples, from, second);
@@ -173,7 +172,7 @@ private:
     static void takePiece(int from, int to, const Source& source, const Target& target)
     {
         const auto behind = [from](auto* row, int bytes) { return row + from * bytes; };
-        takeRow<AsItIs>(to - from, source.mapped(behind), target.mapped(behind));
+        if (from < to) takeRow<AsItIs>(to - from, source.mapped(behind), target.mapped(behind));
     }
 };
 

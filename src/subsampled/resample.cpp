@@ -48,60 +48,104 @@ auto checks(const u8* const src[3], u8* const dst[3], RoiSize roi, int width, in
                         wholeBlocks(roi, width, height));
 }
 
-/// Stores `count` samples at the most.
-PYXCC_INLINE void storePart(u8* p, int count, U8 samples)
-{
-    if (count >= U8::count) return storeSamples(p, samples);
-    u8 buffer[U8::count];
-    storeSamples(buffer, samples);
-    copyBytes(p, buffer, count);
-}
-
-/// Stores samples of two blocks by turns, 2 `count` at the most.
-PYXCC_INLINE void storeByTurns(u8* p, int count, U8 even, U8 odd)
-{
-    expectFrom<expectedStores, 1>(p);
-    const Two<U8> samples = alternated<1>(even, odd);
-    storePart(p, std::min(2 * count, 64), samples.a);
-    if (2 * count > U8::count) storePart(p + U8::count, 2 * count - U8::count, samples.b);
-}
-
-/// Samples of a row and what lies half way to the next ones, with halves rounded up in the first columns and down in
-/// the others. The last sample is its own neighbour.
+/// Samples of a row, and what lies half way to the next ones.
 struct HalfWay {
     U8 own, between;
 };
 
-/// The columns that round up, of n.
-int columnsUp(int n) { return (n - 1) & ~15; }
+/// Every other sample of a row of half width.
+PYXCC_INLINE U8 everyOtherFrom(const u8* p) { return dealt<1>(loadSamples(p), loadSamples(p + U8::count)).a; }
 
-PYXCC_INLINE HalfWay loadHalfWay(const u8* row, int k, int n)
+/// To a row of half width.
+PYXCC_INLINE void storeTurns(u8* p, U8 even, U8 odd)
 {
-    const auto halfWay = [up = columnsUp(n) - k](const u8* p) PYXCC_INLINE_LAMBDA {
+    const Two<U8> samples = alternated<1>(even, odd);
+    storeSamples(p, samples.a);
+    storeSamples(p + U8::count, samples.b);
+}
+
+/// 32 samples of a row of chroma of quarter width. Halves are rounded up.
+struct WholeBlock {
+    static PYXCC_INLINE U8 average(U8 x, U8 y) { return wide::avgUp(x, y); }
+
+    static PYXCC_INLINE HalfWay loadHalfWay(const u8* p)
+    {
+        expectFrom<expectedLoads, 1>(p);
         const U8 own = loadSamples(p);
-        return HalfWay{own, wide::avgUpBelow(up, own, loadSamples(p + 1))};
-    };
-    if (k + U8::count < n) {
-        expectFrom<expectedLoads, 1>(row + k);
-        return halfWay(row + k);
+        return {own, average(own, loadSamples(p + 1))};
     }
-    u8 buffer[U8::count + 1] = {};
-    copyBytes(buffer, row + k, n - k);
-    buffer[n - k] = row[n - 1];
-    return halfWay(buffer);
+
+    static PYXCC_INLINE U8 loadEveryOther(const u8* p)
+    {
+        expectFrom<expectedLoads, 1>(p);
+        return everyOtherFrom(p);
+    }
+
+    static PYXCC_INLINE void store(u8* p, U8 samples)
+    {
+        expectFrom<expectedStores, 1>(p);
+        storeSamples(p, samples);
+    }
+
+    static PYXCC_INLINE void storeByTurns(u8* p, U8 even, U8 odd)
+    {
+        expectFrom<expectedStores, 1>(p);
+        storeTurns(p, even, odd);
+    }
+};
+
+/// The last samples of a row, 32 at the most. Halves are rounded up in the first columns and down in the others, and
+/// the last sample is its own neighbour.
+struct LastBlock {
+    int count;
+    int columnsUp;
+
+    PYXCC_INLINE U8 average(U8 x, U8 y) const { return wide::avgUpBelow(columnsUp, x, y); }
+
+    PYXCC_INLINE HalfWay loadHalfWay(const u8* p) const
+    {
+        u8 buffer[U8::count + 1] = {};
+        copyBytes(buffer, p, count);
+        buffer[count] = p[count - 1];
+        const U8 own = loadSamples(buffer);
+        return {own, average(own, loadSamples(buffer + 1))};
+    }
+
+    PYXCC_INLINE U8 loadEveryOther(const u8* p) const
+    {
+        u8 buffer[2 * U8::count] = {};
+        copyBytes(buffer, p, 2 * count);
+        return everyOtherFrom(buffer);
+    }
+
+    PYXCC_INLINE void store(u8* p, U8 samples) const
+    {
+        u8 buffer[U8::count];
+        storeSamples(buffer, samples);
+        copyBytes(p, buffer, count);
+    }
+
+    PYXCC_INLINE void storeByTurns(u8* p, U8 even, U8 odd) const
+    {
+        u8 buffer[2 * U8::count];
+        storeTurns(buffer, even, odd);
+        copyBytes(p, buffer, 2 * count);
+    }
+};
+
+/// Takes a row of n samples by whole blocks, as far as the columns go that round up, and a last one.
+template <class Take> PYXCC_INLINE void eachBlock(int n, int columnsUp, const Take& take)
+{
+    int k = 0;
+    for (; k + U8::count <= columnsUp; k += U8::count) take(k, WholeBlock());
+    if (k < n) take(k, LastBlock{n - k, columnsUp - k});
 }
 
-/// Every other sample of 2 n, from column 2 i on.
-PYXCC_INLINE U8 loadEveryOther(const u8* row, int i, int n)
-{
-    if (i + U8::count <= n) {
-        expectFrom<expectedLoads, 1>(row + 2 * i);
-        return dealt<1>(loadSamples(row + 2 * i), loadSamples(row + 2 * i + U8::count)).a;
-    }
-    u8 buffer[2 * U8::count] = {};
-    copyBytes(buffer, row + 2 * i, 2 * (n - i));
-    return dealt<1>(loadSamples(buffer), loadSamples(buffer + U8::count)).a;
-}
+/// The columns that round up where samples are interpolated along a row: the last sample is never one of them.
+int columnsUpAlong(int n) { return (n - 1) & ~15; }
+
+/// Those where samples are interpolated between rows.
+int columnsUpBetween(int n) { return n & ~31; }
 
 // One plane of chroma from one grid to another. n is the width of 4:1:1 or 1620 chroma, and rows are those of luma.
 
@@ -110,51 +154,49 @@ void from411To420(const Source& source, const Target& target, int n, int height)
     for (int j = 0; j < height / 2; ++j) {
         const u8* const from = source.row(2 * j);
         u8* const to = target.row(j);
-        for (int k = 0; k < n; k += U8::count) {
-            const HalfWay x = loadHalfWay(from, k, n);
-            storeByTurns(to + 2 * k, n - k, x.own, x.between);
-        }
+        eachBlock(n, columnsUpAlong(n), [&](int k, const auto& block) PYXCC_INLINE_LAMBDA {
+            const HalfWay x = block.loadHalfWay(from + k);
+            block.storeByTurns(to + 2 * k, x.own, x.between);
+        });
     }
 }
 
-/// Rows are interpolated like columns are, but for the last one, which has the source's samples twice.
+/// Rows are interpolated as columns are, but for the last one, which has the source's samples twice.
 void from1620To420(const Source& source, const Target& target, int n, int height)
 {
     const int last = height / 4 - 1;
-    for (int r = 0; r <= last; ++r) {
-        const u8 *const from = source.row(r), *const below = source.row(std::min(r + 1, last));
+    for (int r = 0; r < last; ++r) {
+        const u8 *const from = source.row(r), *const below = source.row(r + 1);
         u8 *const to = target.row(2 * r), *const between = target.row(2 * r + 1);
-        for (int k = 0; k < n; k += U8::count) {
-            const HalfWay x = loadHalfWay(from, k, n);
-            storeByTurns(to + 2 * k, n - k, x.own, x.between);
-            if (r == last) {
-                storeByTurns(between + 2 * k, n - k, x.own, x.own);
-            } else {
-                const HalfWay y = loadHalfWay(below, k, n);
-                const int up = columnsUp(n) - k;
-                storeByTurns(between + 2 * k, n - k, wide::avgUpBelow(up, x.own, y.own),
-                             wide::avgUpBelow(up, x.between, y.between));
-            }
-        }
+        eachBlock(n, columnsUpAlong(n), [&](int k, const auto& block) PYXCC_INLINE_LAMBDA {
+            const HalfWay x = block.loadHalfWay(from + k), y = block.loadHalfWay(below + k);
+            block.storeByTurns(to + 2 * k, x.own, x.between);
+            block.storeByTurns(between + 2 * k, block.average(x.own, y.own), block.average(x.between, y.between));
+        });
     }
+    const u8* const from = source.row(last);
+    u8 *const to = target.row(2 * last), *const below = target.row(2 * last + 1);
+    eachBlock(n, columnsUpAlong(n), [&](int k, const auto& block) PYXCC_INLINE_LAMBDA {
+        const HalfWay x = block.loadHalfWay(from + k);
+        block.storeByTurns(to + 2 * k, x.own, x.between);
+        block.storeByTurns(below + 2 * k, x.own, x.own);
+    });
 }
 
-/// Every other row lies half way between the rows of the source, with halves rounded up in whole blocks of columns and
-/// down in what is left. Such a row is made of the first two rows in any case: of two rows of luma this takes a second
-/// row of chroma, which the source has to have behind its one, and makes four in place of two.
+/// Every other row lies half way between two of the source; the last one is the one above it. A first such row is made
+/// in any case: of two rows of luma it takes a second row of chroma, which the source has to have behind its one, and
+/// makes four rows in place of two.
 void from420To411(const Source& source, const Target& target, int n, int height)
 {
     const int last = std::max(1, height / 2 - 1);
     for (int r = 0; r <= last; ++r) {
         const u8 *const from = source.row(r), *const below = source.row(std::min(r + 1, last));
         u8 *const to = target.row(2 * r), *const between = target.row(2 * r + 1);
-        for (int i = 0; i < n; i += U8::count) {
-            const U8 x = loadEveryOther(from, i, n), y = loadEveryOther(below, i, n);
-            expectFrom<expectedStores, 1>(to + i);
-            expectFrom<expectedStores, 1>(between + i);
-            storePart(to + i, n - i, x);
-            storePart(between + i, n - i, n - i < U8::count ? wide::avgDown(x, y) : wide::avgUp(x, y));
-        }
+        eachBlock(n, columnsUpBetween(n), [&](int i, const auto& block) PYXCC_INLINE_LAMBDA {
+            const U8 x = block.loadEveryOther(from + 2 * i), y = block.loadEveryOther(below + 2 * i);
+            block.store(to + i, x);
+            block.store(between + i, block.average(x, y));
+        });
     }
 }
 
@@ -164,10 +206,9 @@ void from420To1620(const Source& source, const Target& target, int n, int height
     for (int r = 0; r < height / 4; ++r) {
         const u8* const from = source.row(2 * r);
         u8* const to = target.row(r);
-        for (int i = 0; i < n; i += U8::count) {
-            expectFrom<expectedStores, 1>(to + i);
-            storePart(to + i, n - i, loadEveryOther(from, i, n));
-        }
+        eachBlock(n, columnsUpBetween(n), [&](int i, const auto& block) PYXCC_INLINE_LAMBDA {
+            block.store(to + i, block.loadEveryOther(from + 2 * i));
+        });
     }
 }
 
