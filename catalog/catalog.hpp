@@ -35,6 +35,7 @@ enum class Family {
     bt709,
     xyzYcc,
     filterInterlace,
+    ycocg,
 };
 
 struct FamilyInfo {
@@ -94,6 +95,8 @@ struct Parameter {
 };
 
 inline constexpr Parameter aval{"aval", 0, 255, 0, {255}};
+inline constexpr Parameter alphaOfBytes{"alphaValue", 0, 255, 0, {255}};
+inline constexpr Parameter alphaOfWords{"alphaValue", -32768, 32767, 0, {32767}};
 
 /// Matrices of colour twists, as rows. The standard one halves the saturation.
 inline constexpr Parameter twist3x4{

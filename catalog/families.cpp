@@ -38,6 +38,9 @@ constexpr FamilyInfo table[] = {
     {Family::filterInterlace, "filter-interlace", "Filtered and interlaced YCbCr",
      "8-bit YCbCr 4:2:0 and 4:2:2: chroma filtered along the columns, in whole images or in bands, and the two fields "
      "of a frame kept apart."},
+    {Family::ycocg, "ycocg", "YCoCg",
+     "RGB to luma, orange chroma and green chroma and back by additions and shifts, plain or without loss, 8 and 16 "
+     "bits."},
 };
 
 } // namespace

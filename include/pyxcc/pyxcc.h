@@ -19,5 +19,6 @@
 #include "pyxcc/types.h"
 #include "pyxcc/version.h"
 #include "pyxcc/xyz_ycc.h"
+#include "pyxcc/ycocg.h"
 
 #endif

@@ -65,6 +65,7 @@ template <class Source, class Target, class Rule, class... Forms>
 PYXCC_INLINE void convertRows(int width, int rows, const Source& sourceRow, const Target& targetRow,
                               const Plan<Rule, Forms...>& plan)
 {
+    if (width < 1) return; // as exports that do not test the size have it
     const auto ends = plan.rule(width);
     static_assert(std::tuple_size_v<decltype(ends)> == sizeof...(Forms));
     for (int y = 0; y < rows; ++y) {

@@ -3,6 +3,7 @@
 
 #include "lanes/avx2/byte_curve.hpp"
 #include "lanes/avx2/control_word.hpp"
+#include "lanes/avx2/double_width.hpp"
 #include "lanes/avx2/doubles.hpp"
 #include "lanes/avx2/exact_sum.hpp"
 #include "lanes/avx2/floats.hpp"
