@@ -2,7 +2,7 @@
 // of them share.
 #pragma once
 
-#include "layouts/avx2/interleave.hpp"
+#include "layouts/avx2/turns.hpp"
 
 namespace pyxcc::layouts
 {
@@ -96,21 +96,15 @@ PYXCC_INLINE wide::U8 doubled(HalfBlock x)
 namespace detail
 {
 
-/// Even bytes, then odd ones, in each lane.
-constexpr Places evensThenOdds = {0, 2, 4, 6, 8, 10, 12, 14, 1, 3, 5, 7, 9, 11, 13, 15};
-
 /// The low half of a lane interleaved with the high one.
 constexpr Places halvesInTurn = {0, 8, 1, 9, 2, 10, 3, 11, 4, 12, 5, 13, 6, 14, 7, 15};
-
-/// 64-bit quarters 0 2 1 3: brings what both lanes hold of two things together.
-PYXCC_INLINE __m256i swapMiddle(__m256i x) { return _mm256_permute4x64_epi64(x, 0xd8); }
 
 } // namespace detail
 
 /// 16 interleaved pairs, taken apart.
 PYXCC_INLINE ChromaPairs splitPairs(wide::U8 x)
 {
-    const __m256i apart = detail::swapMiddle(detail::shuffle(x.v, detail::evensThenOdds));
+    const __m256i apart = detail::swapMiddle(detail::shuffle(x.v, detail::evenUnitsThenOdd<1>));
     return {{_mm256_castsi256_si128(apart)}, {_mm256_extracti128_si256(apart, 1)}};
 }
 
@@ -178,11 +172,7 @@ PYXCC_INLINE wide::U8 inTurn(wide::U8 even, wide::U8 odd)
 /// The even and the odd bytes of 64: luma and chroma of packed 4:2:2.
 PYXCC_INLINE Two<wide::U8> loadAlternating(const u8* p)
 {
-    const __m256i first = detail::loadWhole(p), second = detail::loadWhole(p + 32);
-    const __m256i low = _mm256_set1_epi16(255);
-    const __m256i even = _mm256_packus_epi16(_mm256_and_si256(first, low), _mm256_and_si256(second, low));
-    const __m256i odd = _mm256_packus_epi16(_mm256_srli_epi16(first, 8), _mm256_srli_epi16(second, 8));
-    return {wide::U8(detail::swapMiddle(even)), wide::U8(detail::swapMiddle(odd))};
+    return dealt<1>(wide::U8(detail::loadWhole(p)), wide::U8(detail::loadWhole(p + 32)));
 }
 
 /// The even bytes as words, and the odd ones.
@@ -239,13 +229,13 @@ template <int First> PYXCC_INLINE Two<wide::Sample> chromaOfPairs(const Two<wide
 /// Writes 64 bytes, the even ones from `even`.
 template <Order order = Order::ofMemory> PYXCC_INLINE void storeAlternating(u8* p, wide::U8 even, wide::U8 odd)
 {
-    const __m256i low = _mm256_unpacklo_epi8(even.v, odd.v), high = _mm256_unpackhi_epi8(even.v, odd.v);
     if constexpr (order == Order::ofMemory) {
-        detail::storeWhole(p, _mm256_permute2x128_si256(low, high, 0x20));
-        detail::storeWhole(p + 32, _mm256_permute2x128_si256(low, high, 0x31));
+        const Two<wide::U8> bytes = alternated<1>(even, odd);
+        detail::storeWhole(p, bytes.a.v);
+        detail::storeWhole(p + 32, bytes.b.v);
     } else {
-        detail::storeWhole(p, detail::swapMiddle(low));
-        detail::storeWhole(p + 32, detail::swapMiddle(high));
+        detail::storeWhole(p, detail::swapMiddle(_mm256_unpacklo_epi8(even.v, odd.v)));
+        detail::storeWhole(p + 32, detail::swapMiddle(_mm256_unpackhi_epi8(even.v, odd.v)));
     }
 }
 
