@@ -40,6 +40,16 @@ template <class Form, class Samples> PYXCC_INLINE auto apply(const WithFourth<Fo
     return Four<Samples>{result.a, result.b, result.c, pixels.d};
 }
 
+/// A form over whole pixels of bytes: three sums, of which the upper halves are the samples, or what is made of them.
+struct OnPixels {
+};
+
+template <std::derived_from<OnPixels> Form, int PixelBytes>
+PYXCC_INLINE wide::PixelWords apply(const Form& form, const wide::Pixels<PixelBytes>& pixels)
+{
+    return asPixelWords(form(pixels));
+}
+
 /// The form of conversions that only move samples.
 struct Unchanged {
 };

@@ -20,4 +20,7 @@ template <class T> Two(T, T) -> Two<T>;
 template <class T> Three(T, T, T) -> Three<T>;
 template <class T> Four(T, T, T, T) -> Four<T>;
 
+/// In place of a channel, where there is none.
+inline constexpr int none = -1;
+
 } // namespace pyxcc

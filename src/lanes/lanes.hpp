@@ -9,6 +9,7 @@
 #include "lanes/avx2/floats.hpp"
 #include "lanes/avx2/integers.hpp"
 #include "lanes/avx2/means.hpp"
+#include "lanes/avx2/pixels.hpp"
 #include "lanes/avx2/samples.hpp"
 #include "lanes/scalar.hpp"
 #include "lanes/several.hpp"

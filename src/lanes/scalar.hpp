@@ -157,4 +157,58 @@ template <std::integral Sample> Sample saturate(S32 x)
     return static_cast<Sample>(std::clamp<s32>(x.v, Limits::min(), Limits::max()));
 }
 
+/// Three channels of bytes.
+struct Pixel {
+    u8 channels[3];
+};
+
+/// Two words of a pixel.
+struct WordPair {
+    S16 lower, upper;
+
+    friend WordPair operator-(WordPair x, WordPair y) { return {x.lower - y.lower, x.upper - y.upper}; }
+    friend WordPair operator+(WordPair x, const Two<int>& k) { return {x.lower + k.a, x.upper + k.b}; }
+    friend WordPair operator-(WordPair x, const Two<int>& k) { return {x.lower - k.a, x.upper - k.b}; }
+    friend WordPair operator<<(WordPair x, int n) { return {x.lower << n, x.upper << n}; }
+};
+
+/// Two channels as words.
+template <int Lower, int Upper> WordPair wordsOf(const Pixel& pixel)
+{
+    const auto channel = [&](int c) { return c == none ? 0 : int{pixel.channels[c]}; };
+    return {channel(Lower), channel(Upper)};
+}
+
+/// High halves of the products of both words.
+template <int Lower, int Upper> WordPair mulHighS16(WordPair x)
+{
+    return {mulHighS16(x.lower, Lower), mulHighS16(x.upper, Upper)};
+}
+
+/// The products of both words, added up.
+template <int Lower, int Upper> S32 sumOfProducts(WordPair x) { return x.lower.v * Lower + x.upper.v * Upper; }
+
+/// The lower half in both places.
+inline WordPair twice(S32 x) { return {x.v, x.v}; }
+
+/// The high half of the product of the upper half, as an upper half.
+template <int Weight> S32 upperMulHighS16(S32 x) { return S32(mulHighS16(S16((x >> 16).v), Weight).v) << 16; }
+
+/// The weighted sum of the channels, of which the upper half counts.
+template <int A, int B, int C> S32 upperSum(const Pixel& pixel)
+{
+    return A * pixel.channels[0] + B * pixel.channels[1] + C * pixel.channels[2];
+}
+
+/// The samples of a pixel, which saturate on their way to bytes: the first one as an upper half, the others as words.
+struct PixelWords {
+    S32 upperFirst;
+    WordPair others;
+};
+
+inline PixelWords pixelWords(S32 upperFirst, WordPair others) { return {upperFirst, others}; }
+
+inline PixelWords asPixelWords(const PixelWords& x) { return x; }
+inline PixelWords asPixelWords(const Three<S32>& upper) { return {upper.a, {(upper.b >> 16).v, (upper.c >> 16).v}}; }
+
 } // namespace pyxcc::scalar

@@ -9,44 +9,48 @@ namespace pyxcc::matrix
 
 // Bytes: 32-bit sums, of which what lies below the point is cut off.
 
-struct RgbToXyzBytes : frame::OnWords {
-    template <class Word> PYXCC_INLINE auto operator()(const Word& R, const Word& G, const Word& B) const
+/// In 65536ths of a step.
+struct RgbToXyzBytes : frame::OnPixels {
+    template <class Pixels> PYXCC_INLINE auto operator()(const Pixels& rgb) const
     {
-        return Three{sat8(exactSum<16, 0, 27030, 23434, 11824>(R, G, B)),
-                     sat8(exactSum<16, 0, 13937, 46868, 4729>(R, G, B)),
-                     sat8(exactSum<16, 0, 1267, 7811, 62274>(R, G, B))};
+        return Three{upperSum<27030, 23434, 11824>(rgb), upperSum<13937, 46868, 4729>(rgb),
+                     upperSum<1267, 7811, 62274>(rgb)};
     }
 };
 
-struct XyzToRgbBytes : frame::OnWords {
-    template <class Word> PYXCC_INLINE auto operator()(const Word& X, const Word& Y, const Word& Z) const
+struct XyzToRgbBytes : frame::OnPixels {
+    template <class Pixels> PYXCC_INLINE auto operator()(const Pixels& xyz) const
     {
-        return Three{sat8(exactSum<16, 0, 212368, -100738, -32671>(X, Y, Z)),
-                     sat8(exactSum<16, 0, -63521, 122944, 2723>(X, Y, Z)),
-                     sat8(exactSum<16, 0, 3646, -13372, 69291>(X, Y, Z))};
+        return Three{upperSum<212368, -100738, -32671>(xyz), upperSum<-63521, 122944, 2723>(xyz),
+                     upperSum<3646, -13372, 69291>(xyz)};
     }
 };
 
-/// Luma and what the colours exceed it by are cut off to sixteenths of a step first.
-struct RgbToYccBytes : frame::OnWords {
-    template <class Word> PYXCC_INLINE auto operator()(const Word& R, const Word& G, const Word& B) const
+/// Luma, and what the colours exceed it by, are cut off to sixteenths of a step first, differences downwards, so that
+/// what is taken off for them is cut off upwards. The zeros of C1 and C2 are at 156 and 137, which keeps both within a
+/// byte.
+struct RgbToYccBytes : frame::OnPixels {
+    template <class Pixels> PYXCC_INLINE auto operator()(const Pixels& rgb) const
     {
-        const auto s = exactSum<10, 0, 4898, 9617, 1867>(R, G, B);
-        const auto blueExcess = exactSum<10, 0, -4898, -9617, 16384 - 1867>(R, G, B);
-        const auto redExcess = exactSum<10, 0, 16384 - 4898, -9617, -1867>(R, G, B);
-        return Three{sat8(mulHighS16(s, 2921)), low8(mulHighS16(blueExcess, 1789) - 100),
-                     low8(mulHighS16(redExcess, 2178) - 119)};
+        const auto bluesAndReds = wordsOf<2, 0>(rgb);
+        const auto s = sumOfProducts<1867, 4898>(bluesAndReds) + sumOfProducts<9617, 0>(wordsOf<1, none>(rgb));
+        const auto excess = (bluesAndReds << 4) - twice((s + 1023) >> 10);
+        return pixelWords(upperMulHighS16<2921>(s << 6), mulHighS16<1789, 2178>(excess) + Two{156, 137});
     }
 };
 
-/// The zeros of C1 and C2 are at 156 and 137.
-struct YccToRgbBytes : frame::OnWords {
-    template <class Word> PYXCC_INLINE auto operator()(const Word& Y, const Word& C1, const Word& C2) const
+/// In 65536ths of a step, to which the factors of 4096ths go with 16 times the samples. G has a and b of the other two
+/// as 256ths of those, cut off: 128 times the sample takes twice the factor to be there in the upper half.
+struct YccToRgbBytes : frame::OnPixels {
+    template <class Pixels> PYXCC_INLINE auto operator()(const Pixels& ycc) const
     {
-        const auto a = highShare<156, 2 * 9084>(C1), b = highShare<137, 2 * 7460>(C2); // in sixteenths of a step
-        return Three{sat8(exactSum<12, -137 * 7460, 5564, 7460>(Y, C2)),
-                     sat8(exactSum<16, 0, 16 * 5564, -794, -2084>(Y, a, b)),
-                     sat8(exactSum<12, -156 * 9084, 5564, 9084>(Y, C1))};
+        constexpr int zero1 = 156, zero2 = 137;
+        const auto y1 = (wordsOf<0, 1>(ycc) << 4) - Two{0, 16 * zero1};
+        const auto y2 = (wordsOf<0, 2>(ycc) << 4) - Two{0, 16 * zero2};
+        const auto chroma = (wordsOf<1, 2>(ycc) << 7) - Two{128 * zero1, 128 * zero2};
+        const auto ab = mulHighS16<2 * 9084, 2 * 7460>(chroma);
+        return Three{sumOfProducts<5564, 7460>(y2), sumOfProducts<5564, 0>(y1) + sumOfProducts<-794, -2084>(ab),
+                     sumOfProducts<5564, 9084>(y1)};
     }
 };
 

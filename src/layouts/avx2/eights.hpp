@@ -2,6 +2,7 @@
 // of a register, and fewer registers at a time.
 #pragma once
 
+#include "lanes/avx2/pixels.hpp"
 #include "layouts/avx2/interleave.hpp"
 
 #include <type_traits>
@@ -37,27 +38,77 @@ template <class Byte> PYXCC_INLINE __m256i foursOfChannels(const Three<wide::S32
     return std::is_signed_v<Byte> ? _mm256_packs_epi16(ac, bb) : _mm256_packus_epi16(ac, bb);
 }
 
+/// Where the four pixels' bytes of each channel start, and how far it is from one to the next.
+struct FoursOfChannels {
+    std::array<int, 3> first;
+    int stride;
+};
+
 /// The sources of a shuffle that brings those to pixels of `bytes` bytes each; what is left is cleared.
-constexpr Places byPixels(int bytes)
+constexpr Places byPixels(int bytes, const FoursOfChannels& fours = {{0, 8, 4}, 1})
 {
-    constexpr int first[] = {0, 8, 4};
     Places places{};
     for (int i = 0; i < 16; ++i) {
         const int pixel = i / bytes, channel = i % bytes;
-        places[i] = pixel < 4 && channel < 3 ? static_cast<u8>(first[channel] + pixel) : 0x80;
+        const bool used = pixel < 4 && channel < 3;
+        places[i] = used ? static_cast<u8>(fours.first[channel] + pixel * fours.stride) : 0x80;
     }
     return places;
 }
 
+/// The second and the third channel in turn as bytes, saturated, and the first one with something in between.
+inline constexpr FoursOfChannels foursOfPixelWords{{9, 0, 1}, 2};
+
+PYXCC_INLINE __m256i bytesOf(const wide::PixelWords& x) { return _mm256_packus_epi16(x.others.v, x.upperFirst.v); }
+
+/// Writes the first three quarters of each half, one behind the other.
+PYXCC_INLINE void storeTwelves(u8* p, __m256i twelves)
+{
+    const __m256i x = _mm256_permutevar8x32_epi32(twelves, _mm256_setr_epi32(0, 1, 2, 4, 5, 6, 7, 7));
+    _mm_storeu_si128(reinterpret_cast<__m128i*>(p), _mm256_castsi256_si128(x));
+    _mm_storel_epi64(reinterpret_cast<__m128i*>(p + 16), _mm256_extracti128_si256(x, 1));
+}
+
+/// Writes 8 pixels of four bytes, of which the fourth are zero; each fourth byte is put back as it was.
+PYXCC_INLINE void storeUnderFourths(u8* p, __m256i pixels)
+{
+    const __m256i fourths = _mm256_set1_epi32(static_cast<int>(0xff000000u));
+    storeWhole(p, _mm256_or_si256(pixels, _mm256_and_si256(loadWhole(p), fourths)));
+}
+
 } // namespace detail
+
+/// Reads 8 pixels of three or four bytes as they lie.
+template <int PixelBytes> PYXCC_INLINE wide::Pixels<PixelBytes> loadEight(const u8* p)
+{
+    if constexpr (PixelBytes == 4) {
+        return wide::Pixels<4>(detail::loadWhole(p));
+    } else {
+        // The upper half of the register ends where the pixels end.
+        const __m128i low = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p));
+        const __m128i high = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + 8));
+        return wide::Pixels<3>(_mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1));
+    }
+}
+
+/// Writes 8 pixels of three bytes, saturated.
+PYXCC_INLINE void storeEightTriples(u8* p, const wide::PixelWords& pixels)
+{
+    using namespace detail;
+    storeTwelves(p, shuffle(bytesOf(pixels), byPixels(3, foursOfPixelWords)));
+}
+
+/// Writes the first three bytes of 8 pixels of four, saturated; each fourth byte is put back as it was.
+PYXCC_INLINE void storeEightQuadruples(u8* p, const wide::PixelWords& pixels)
+{
+    using namespace detail;
+    storeUnderFourths(p, shuffle(bytesOf(pixels), byPixels(4, foursOfPixelWords)));
+}
 
 /// Reads 8 pixels of three bytes.
 template <class Byte> PYXCC_INLINE Three<wide::F32> loadEightTriples(const u8* p)
 {
-    // The upper half of the register ends where the pixels end.
-    const __m128i low = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p));
-    const __m128i high = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + 8));
-    const __m256i x = _mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1);
+    const __m256i x = loadEight<3>(p).v;
     const auto channel = [x]<int C>(std::integral_constant<int, C>) PYXCC_INLINE_LAMBDA {
         static constexpr auto places = detail::zeroExtending([](int i) { return 3 * i + C - (i < 4 ? 0 : 8); });
         return detail::floatsOfBytes<Byte>(_mm256_shuffle_epi8(x, detail::loadWhole(places.data())));
@@ -69,10 +120,7 @@ template <class Byte> PYXCC_INLINE Three<wide::F32> loadEightTriples(const u8* p
 /// Writes 8 pixels of three bytes, saturated.
 template <class Byte> PYXCC_INLINE void storeEightTriples(u8* p, const Three<wide::S32>& pixels)
 {
-    const __m256i twelves = detail::shuffle(detail::foursOfChannels<Byte>(pixels), detail::byPixels(3));
-    const __m256i x = _mm256_permutevar8x32_epi32(twelves, _mm256_setr_epi32(0, 1, 2, 4, 5, 6, 7, 7));
-    _mm_storeu_si128(reinterpret_cast<__m128i*>(p), _mm256_castsi256_si128(x));
-    _mm_storel_epi64(reinterpret_cast<__m128i*>(p + 16), _mm256_extracti128_si256(x, 1));
+    detail::storeTwelves(p, detail::shuffle(detail::foursOfChannels<Byte>(pixels), detail::byPixels(3)));
 }
 
 /// Reads the first three bytes of 8 pixels of four.
@@ -90,9 +138,7 @@ template <class Byte> PYXCC_INLINE Three<wide::F32> loadEightQuadruples(const u8
 /// Writes the first three bytes of 8 pixels of four, saturated; each fourth byte is put back as it was.
 template <class Byte> PYXCC_INLINE void storeEightQuadruples(u8* p, const Three<wide::S32>& pixels)
 {
-    const __m256i x = detail::shuffle(detail::foursOfChannels<Byte>(pixels), detail::byPixels(4));
-    const __m256i fourths = _mm256_set1_epi32(static_cast<int>(0xff000000u));
-    detail::storeWhole(p, _mm256_or_si256(x, _mm256_and_si256(detail::loadWhole(p), fourths)));
+    detail::storeUnderFourths(p, detail::shuffle(detail::foursOfChannels<Byte>(pixels), detail::byPixels(4)));
 }
 
 } // namespace pyxcc::layouts

@@ -63,6 +63,7 @@ template <class Samples> PYXCC_INLINE void storeThreefold(u8* p, Samples samples
 template <class Samples> PYXCC_INLINE void storeThreefold(u8* p, Samples samples, Samples fourths)
 {
     constexpr int bytes = sampleBytes<Samples>;
+    static_assert(bytes <= 4);
     // A register takes its first lane's samples from the one lane and its second lane's from the other.
     const __m256i byLanes = _mm256_setr_epi32(0, 2, 4, 6, 1, 3, 5, 7);
     const __m256i x = _mm256_permutevar8x32_epi32(detail::raw(samples), byLanes);
