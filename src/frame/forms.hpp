@@ -21,6 +21,12 @@ PYXCC_INLINE Three<wide::U8> narrowAll(const Three<wide::Byte>& low, const Three
     return {narrow(low.a, high.a), narrow(low.b, high.b), narrow(low.c, high.c)};
 }
 
+template <std::derived_from<OnWords> Form>
+PYXCC_INLINE auto apply(const Form& form, const Two<Three<wide::Sample>>& pixels)
+{
+    return narrowAll(form(pixels.a.a, pixels.a.b, pixels.a.c), form(pixels.b.a, pixels.b.b, pixels.b.c));
+}
+
 template <std::derived_from<OnWords> Form> PYXCC_INLINE auto apply(const Form& form, const Three<wide::U8>& pixels)
 {
     const Two<wide::Sample> a = widen(pixels.a), b = widen(pixels.b), c = widen(pixels.c);

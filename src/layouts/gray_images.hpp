@@ -2,6 +2,7 @@
 #pragma once
 
 #include "layouts/avx2/chroma.hpp"
+#include "layouts/avx2/eights.hpp"
 #include "layouts/avx2/gray.hpp"
 #include "layouts/images.hpp"
 
@@ -37,6 +38,14 @@ template <class Register> struct C4Gray {
     PYXCC_INLINE void store(u8* p, Samples samples) const { storeThreefold(p, samples, fourth); }
 };
 
+/// Three bytes a pixel, or four of which the first three take part, as words.
+template <int PixelBytes> struct BytesAsWords {
+    using Samples = wide::U8;
+    static constexpr int pixelBytes = PixelBytes;
+
+    static PYXCC_INLINE Two<Three<wide::Sample>> load(const u8* p) { return loadAsWords<PixelBytes>(p); }
+};
+
 /// Luma and chroma bytes in turn, of which the luma is taken.
 struct LumaOfC2 {
     using Samples = wide::U8;
@@ -59,6 +68,16 @@ template <class Sample> auto c3Gray(Sample* first, std::ptrdiff_t step)
 template <class Sample> auto c4Gray(Sample* first, std::ptrdiff_t step, Sample fourth)
 {
     return detail::interleaved(first, step, C4Gray<detail::RegisterOf<Sample>>{fourth});
+}
+
+/// Sources of words, for targets of any order.
+inline auto c3AsWords(const u8* first, std::ptrdiff_t step)
+{
+    return detail::interleaved(first, step, BytesAsWords<3>{});
+}
+inline auto ac4AsWords(const u8* first, std::ptrdiff_t step)
+{
+    return detail::interleaved(first, step, BytesAsWords<4>{});
 }
 
 inline auto lumaOfC2(const u8* first, std::ptrdiff_t step) { return detail::interleaved(first, step, LumaOfC2{}); }

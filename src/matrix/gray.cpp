@@ -19,6 +19,7 @@ namespace
 /// Layouts of a source, with the target that goes with them.
 struct FromC3 {
     template <class Sample> static auto source(const Sample* src, std::ptrdiff_t step) { return c3(src, step); }
+    static auto words(const u8* src, std::ptrdiff_t step) { return c3AsWords(src, step); }
     template <class Sample> static auto target(Sample* dst, std::ptrdiff_t step) { return c1(dst, step); }
 };
 struct FromAC4 {
@@ -26,6 +27,7 @@ struct FromAC4 {
     {
         return ac4<Order::any>(src, step);
     }
+    static auto words(const u8* src, std::ptrdiff_t step) { return ac4AsWords(src, step); }
     template <class Sample> static auto target(Sample* dst, std::ptrdiff_t step) { return c1<Order::any>(dst, step); }
 };
 
@@ -39,8 +41,8 @@ template <class Layout> PyxStatus gray(const u8* src, int srcStep, u8* dst, int 
     if (const PyxStatus failure = grayFailure(src, dst, roi)) return failure;
     const GrayWeights<int> weights = in32768ths(grayWeights(coeffs));
     const GrayExact exact(weights);
-    const auto source = Layout::source(src, srcStep);
-    const auto target = Layout::target(dst, dstStep);
+    const auto source = Layout::words(src, srcStep);
+    const auto target = c1<Order::any>(dst, dstStep);
     if (!GrayHigh::suits(weights)) return eachRow(roi, source, target, everyPixel(exact));
     return eachRow(roi, source, target, wideThenTail<16>(GrayHigh(weights), exact));
 }

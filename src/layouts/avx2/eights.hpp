@@ -91,6 +91,46 @@ template <int PixelBytes> PYXCC_INLINE wide::Pixels<PixelBytes> loadEight(const 
     }
 }
 
+namespace detail
+{
+
+/// The sources of a shuffle that brings channels to the upper bytes of words, four pixels' words of the one and then of
+/// the other.
+template <int PixelBytes, int First, int Second>
+constexpr std::array<u8, 32> upperBytes = [] {
+    std::array<u8, 32> places{};
+    for (int i = 0; i < 32; ++i) {
+        const int channel = i % 16 < 8 ? First : Second, pixel = i / 16 * 4 + i % 8 / 2;
+        const bool used = i % 2 != 0 && channel != none;
+        places[i] = used ? static_cast<u8>(wide::Pixels<PixelBytes>::placeOf(pixel, channel)) : 0x80;
+    }
+    return places;
+}();
+
+/// The channels of 16 pixels as words.
+template <int PixelBytes> PYXCC_INLINE Three<wide::Sample> loadSixteen(const u8* p)
+{
+    const __m256i x = loadEight<PixelBytes>(p).v, y = loadEight<PixelBytes>(p + 8 * PixelBytes).v;
+    const auto words = [](__m256i eight, const std::array<u8, 32>& places)
+                           PYXCC_INLINE_LAMBDA { return _mm256_shuffle_epi8(eight, loadWhole(places.data())); };
+    const auto sample = [](__m256i in256ths) PYXCC_INLINE_LAMBDA {
+        return wide::Sample{wide::S16(_mm256_srli_epi16(in256ths, 8)), wide::U16(in256ths)};
+    };
+    const __m256i abX = words(x, upperBytes<PixelBytes, 0, 1>), abY = words(y, upperBytes<PixelBytes, 0, 1>);
+    const __m256i cX = words(x, upperBytes<PixelBytes, 2, none>), cY = words(y, upperBytes<PixelBytes, none, 2>);
+    return {sample(_mm256_unpacklo_epi64(abX, abY)), sample(_mm256_unpackhi_epi64(abX, abY)),
+            sample(_mm256_or_si256(cX, cY))};
+}
+
+} // namespace detail
+
+/// Reads 32 pixels of three or four bytes, the first three channels of which come as words. Narrowed to bytes they
+/// stand where loadQuadruples() puts them.
+template <int PixelBytes> PYXCC_INLINE Two<Three<wide::Sample>> loadAsWords(const u8* p)
+{
+    return {detail::loadSixteen<PixelBytes>(p), detail::loadSixteen<PixelBytes>(p + 16 * PixelBytes)};
+}
+
 /// Writes 8 pixels of three bytes, saturated.
 PYXCC_INLINE void storeEightTriples(u8* p, const wide::PixelWords& pixels)
 {
