@@ -6,38 +6,41 @@
 #include "layouts/pixel_images.hpp"
 #include "matrix/xyz_ycc_forms.hpp"
 
+#include <concepts>
+
 namespace pyxcc::matrix
 {
 
-/// The layouts that a form takes.
-template <class Form> struct LayoutsFor {
-    template <class Sample> static auto c3(Sample* first, int step) { return layouts::c3(first, step); }
-    template <class Sample> static auto ac4(Sample* first, int step)
+/// Layouts, as the form takes them.
+struct InC3 {
+    template <class Form, class Sample> static auto image(Sample* first, int step)
     {
-        return layouts::ac4<layouts::Order::any>(first, step);
+        if constexpr (std::derived_from<Form, frame::OnPixels>) {
+            return layouts::c3Pixels(first, step);
+        } else {
+            return layouts::c3(first, step);
+        }
     }
 };
-template <std::derived_from<frame::OnPixels> Form> struct LayoutsFor<Form> {
-    template <class Byte> static auto c3(Byte* first, int step) { return layouts::c3Pixels(first, step); }
-    template <class Byte> static auto ac4(Byte* first, int step) { return layouts::ac4Pixels(first, step); }
+
+struct InAC4 {
+    template <class Form, class Sample> static auto image(Sample* first, int step)
+    {
+        if constexpr (std::derived_from<Form, frame::OnPixels>) {
+            return layouts::ac4Pixels(first, step);
+        } else {
+            return layouts::ac4<layouts::Order::any>(first, step);
+        }
+    }
 };
 
-template <class Form, class Sample>
-PyxStatus convertC3(const Sample* src, int srcStep, Sample* dst, int dstStep, RoiSize roi)
+template <class Layout, class Form, class Sample>
+PyxStatus convert(const Sample* src, int srcStep, Sample* dst, int dstStep, RoiSize roi)
 {
     using namespace frame;
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    using Layouts = LayoutsFor<Form>;
-    return eachRow(roi, Layouts::c3(src, srcStep), Layouts::c3(dst, dstStep), everyPixel(Form{}));
-}
-
-template <class Form, class Sample>
-PyxStatus convertAC4(const Sample* src, int srcStep, Sample* dst, int dstStep, RoiSize roi)
-{
-    using namespace frame;
-    if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    using Layouts = LayoutsFor<Form>;
-    return eachRow(roi, Layouts::ac4(src, srcStep), Layouts::ac4(dst, dstStep), everyPixel(Form{}));
+    return eachRow(roi, Layout::template image<Form>(src, srcStep), Layout::template image<Form>(dst, dstStep),
+                   everyPixel(Form{}));
 }
 
 } // namespace pyxcc::matrix

@@ -7,40 +7,40 @@ using namespace pyxcc::matrix;
 
 PyxStatus PYXCC_CALL pyxiRGBToXYZ_8u_C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
-    return convertC3<RgbToXyzBytes>(src, srcStep, dst, dstStep, roi);
+    return convert<InC3, RgbToXyzBytes>(src, srcStep, dst, dstStep, roi);
 }
 
 PyxStatus PYXCC_CALL pyxiRGBToXYZ_8u_AC4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
-    return convertAC4<RgbToXyzBytes>(src, srcStep, dst, dstStep, roi);
+    return convert<InAC4, RgbToXyzBytes>(src, srcStep, dst, dstStep, roi);
 }
 
 PyxStatus PYXCC_CALL pyxiRGBToYCC_8u_C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
-    return convertC3<RgbToYccBytes>(src, srcStep, dst, dstStep, roi);
+    return convert<InC3, RgbToYccBytes>(src, srcStep, dst, dstStep, roi);
 }
 
 PyxStatus PYXCC_CALL pyxiRGBToYCC_8u_AC4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
-    return convertAC4<RgbToYccBytes>(src, srcStep, dst, dstStep, roi);
+    return convert<InAC4, RgbToYccBytes>(src, srcStep, dst, dstStep, roi);
 }
 
 PyxStatus PYXCC_CALL pyxiXYZToRGB_8u_C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
-    return convertC3<XyzToRgbBytes>(src, srcStep, dst, dstStep, roi);
+    return convert<InC3, XyzToRgbBytes>(src, srcStep, dst, dstStep, roi);
 }
 
 PyxStatus PYXCC_CALL pyxiXYZToRGB_8u_AC4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
-    return convertAC4<XyzToRgbBytes>(src, srcStep, dst, dstStep, roi);
+    return convert<InAC4, XyzToRgbBytes>(src, srcStep, dst, dstStep, roi);
 }
 
 PyxStatus PYXCC_CALL pyxiYCCToRGB_8u_C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
-    return convertC3<YccToRgbBytes>(src, srcStep, dst, dstStep, roi);
+    return convert<InC3, YccToRgbBytes>(src, srcStep, dst, dstStep, roi);
 }
 
 PyxStatus PYXCC_CALL pyxiYCCToRGB_8u_AC4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
-    return convertAC4<YccToRgbBytes>(src, srcStep, dst, dstStep, roi);
+    return convert<InAC4, YccToRgbBytes>(src, srcStep, dst, dstStep, roi);
 }

@@ -209,4 +209,43 @@ TEST(Doubles, AC4Loads)
     expectDoublesLoad<4>([](const f64* first) { return layouts::ac4(first, 0); });
 }
 
+/// The words of a channel, and 256 times as large, are its bytes once they are narrowed and brought to the order of
+/// memory.
+template <int PixelBytes, class ImageAt> void expectWordsLoad(const ImageAt& imageAt)
+{
+    namespace wide = pyxcc::wide;
+    support::Random random(6);
+    for (const Placement placement : placements) {
+        for (int count = 1; count <= 32; ++count) {
+            const Memory memory = rowOf<u8>(placement, count, PixelBytes, random);
+            const auto pixels = loadPixels(imageAt(memory.bytes().data()).row(0), count);
+            const auto expectChannel = [&](int channel, const wide::Sample& low, const wide::Sample& high) {
+                const auto bytes = [](wide::S16 x, wide::S16 y) {
+                    return samplesOf<u8>(layouts::inMemoryOrder<layouts::Order::any>(narrow({x.v}, {y.v})));
+                };
+                const auto words = bytes(low, high);
+                const auto upper = bytes(asS16(low.in256ths >> 8), asS16(high.in256ths >> 8));
+                for (int i = 0; i < 32; ++i) {
+                    const u8 told = i < count ? memory.bytes()[(firstColumn + i) * PixelBytes + channel] : u8{};
+                    ASSERT_EQ(words[i], told) << "channel " << channel << " of pixel " << i << " of " << count;
+                    ASSERT_EQ(upper[i], told) << "channel " << channel << " of pixel " << i << " of " << count;
+                }
+            };
+            expectChannel(0, pixels.a.a, pixels.b.a);
+            expectChannel(1, pixels.a.b, pixels.b.b);
+            expectChannel(2, pixels.a.c, pixels.b.c);
+        }
+    }
+}
+
+TEST(BytesAsWords, C3Loads)
+{
+    expectWordsLoad<3>([](const u8* first) { return layouts::c3AsWords(first, 0); });
+}
+
+TEST(BytesAsWords, AC4Loads)
+{
+    expectWordsLoad<4>([](const u8* first) { return layouts::ac4AsWords(first, 0); });
+}
+
 } // namespace
