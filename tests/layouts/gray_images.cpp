@@ -221,7 +221,8 @@ template <int PixelBytes, class ImageAt> void expectWordsLoad(const ImageAt& ima
             const auto pixels = loadPixels(imageAt(memory.bytes().data()).row(0), count);
             const auto expectChannel = [&](int channel, const wide::Sample& low, const wide::Sample& high) {
                 const auto bytes = [](wide::S16 x, wide::S16 y) {
-                    return samplesOf<u8>(layouts::inMemoryOrder<layouts::Order::any>(narrow({x.v}, {y.v})));
+                    return samplesOf<u8>(
+                        layouts::inMemoryOrder<layouts::Order::any>(wide::narrow(wide::Byte(x.v), wide::Byte(y.v))));
                 };
                 const auto words = bytes(low, high);
                 const auto upper = bytes(asS16(low.in256ths >> 8), asS16(high.in256ths >> 8));
