@@ -36,6 +36,7 @@ enum class Family {
     xyzYcc,
     filterInterlace,
     ycocg,
+    cbycr422,
 };
 
 struct FamilyInfo {

@@ -41,6 +41,9 @@ constexpr FamilyInfo table[] = {
     {Family::ycocg, "ycocg", "YCoCg",
      "RGB to luma, orange chroma and green chroma and back by additions and shifts, plain or without loss, 8 and 16 "
      "bits."},
+    {Family::cbycr422, "cbycr422", "Packed CbYCr 4:2:2",
+     "8-bit RGB to the packed 4:2:2 form with chroma first and back by BT.601, with a gamma-corrected one, and other "
+     "YCbCr forms to it and back."},
 };
 
 } // namespace

@@ -6,6 +6,7 @@
 #define PYXCC_PYXCC_H
 
 #include "pyxcc/bt709.h"
+#include "pyxcc/cbycr422.h"
 #include "pyxcc/color_twist.h"
 #include "pyxcc/filter_interlace.h"
 #include "pyxcc/gamma.h"

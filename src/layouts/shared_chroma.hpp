@@ -240,6 +240,12 @@ template <Order order> struct ChromaFirst {
     }
 };
 
+/// The same, but in a row of one pixel as well the sample that it lacks is two bytes in front of the one that it has,
+/// which is in front of the row.
+template <Order order> struct ChromaFirstFromBefore : ChromaFirst<order> {
+    static PYXCC_INLINE void completeLastPair(u8* end, const u8* row, int width) { end[0] = row[2 * width - 4]; }
+};
+
 /// A packing with its two chroma components exchanged.
 template <class Packing> struct ChromaExchanged : Packing {
     static PYXCC_INLINE auto load(const u8* p)
@@ -287,6 +293,12 @@ template <class Byte> auto c2LumaFirstAlone(Byte* first, int step)
 template <Order order = Order::ofMemory, class Byte> auto c2ChromaFirst(Byte* first, int step)
 {
     return InterleavedImage<ChromaFirst<order>, Byte>{first, step, {}};
+}
+
+/// The same as a source whose rows of one pixel have a byte of chroma two bytes in front of them.
+template <Order order = Order::ofMemory, class Byte> auto c2ChromaFirstFromBefore(Byte* first, int step)
+{
+    return InterleavedImage<ChromaFirstFromBefore<order>, Byte>{first, step, {}};
 }
 
 /// The same image with its chroma components exchanged, Cr before Cb.

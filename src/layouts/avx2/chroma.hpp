@@ -163,6 +163,16 @@ template <int Columns, Order order = Order::ofMemory> PYXCC_INLINE void storeApa
 /// The samples of both components of sums of two neighbours, interleaved.
 PYXCC_INLINE wide::U8 inTurn(NarrowedPairs x) { return wide::U8(detail::shuffle(x.v.v, detail::halvesInTurn)); }
 
+/// The bytes of pairs under the taps 1, 2, 1 around each even one: it comes twice, the odd one behind it and the one in
+/// front of it once. `before` is in front of the first.
+PYXCC_INLINE wide::S16 tapSums(wide::U8 x, u8 before)
+{
+    const __m256i lowHalf =
+        _mm256_inserti128_si256(_mm256_set1_epi8(static_cast<char>(before)), _mm256_castsi256_si128(x.v), 1);
+    const __m256i inFront = _mm256_and_si256(_mm256_alignr_epi8(x.v, lowHalf, 15), _mm256_set1_epi16(255));
+    return wide::S16(_mm256_add_epi16(_mm256_maddubs_epi16(x.v, _mm256_set1_epi16(0x0102)), inFront));
+}
+
 /// The even bytes of one block and the odd ones of another.
 PYXCC_INLINE wide::U8 inTurn(wide::U8 even, wide::U8 odd)
 {
