@@ -69,6 +69,11 @@ struct AsTheyAre {
 };
 inline constexpr AsTheyAre asTheyAre;
 
+/// Packed rows that begin with chroma.
+inline constexpr auto chromaFirst = []<class Byte>(Byte* pixels, int step) {
+    return layouts::Packed<layouts::First::chroma, Byte>{pixels, step};
+};
+
 /// The third before the second.
 inline constexpr auto exchangedPlanes = []<class Byte>(Byte* const planes[3], const int steps[3]) {
     return layouts::ThreePlanes<Byte>{{planes[0], planes[2], planes[1]}, {steps[0], steps[2], steps[1]}};
