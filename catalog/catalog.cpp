@@ -81,7 +81,9 @@ Export describe(std::string_view name, PyxStatus(PYXCC_CALL* function)(A...), Fa
     entry.source.chromaUp = traits.sourceChromaUp;
     entry.target.chromaUp = traits.targetChromaUp;
     entry.source.byteInFront = traits.sourceByteInFront;
-    entry.source.evenStep = entry.target.evenStep = traits.evenSteps;
+    if (traits.wholeSteps) {
+        for (Side* side : {&entry.source, &entry.target}) side->stepUnit = sizeOf(side->element);
+    }
     readSignature<A...>(entry);
     entry.function = reinterpret_cast<Function>(function);
     entry.invoke = naming.inPlace ? &detail::invoke<true, A...> : &detail::invoke<false, A...>;

@@ -27,6 +27,8 @@ enum class Family {
     gamma,
     gray,
     repack,
+    hls,
+    hsv,
     rgbYCbCr,
     rgbYuv,
     rgbToSubsampled,
@@ -159,7 +161,7 @@ struct Traits {
     Range range = {};                         ///< of the source's samples
     double tolerance = 0;                     ///< by which a target sample may be off, where its last bit is left open
     bool followsRounding = false;             ///< an integer result depends on the caller's rounding mode
-    bool evenSteps = false;                   ///< steps count without their low bit
+    bool wholeSteps = false;                  ///< of a step, only the whole samples count
     bool allocates = false;                   ///< takes scratch memory from the core library, for large images at least
     Beyond (*beyond)(double, RoiSize) = nullptr; ///< rows outside of the region, by the first parameter
 };
@@ -185,7 +187,7 @@ struct Side {
     bool chromaUp = false;        ///< a part of such a block has a sample of its own
     int byteInFront = 0;          ///< so far in front of a row, if that is one pixel wide, a byte is read
     bool spareFourth = false;     ///< AC4: the fourth sample is not read, or keeps its value
-    bool evenStep = false;        ///< a step counts without its low bit
+    int stepUnit = 1;             ///< of a step, only whole multiples of this count
 };
 
 /// The side that a model, a layout token and an element make, as an export's name would.

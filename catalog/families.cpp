@@ -21,6 +21,9 @@ constexpr FamilyInfo table[] = {
     {Family::repack, "repack", "Chroma repacking and resampling",
      "8-bit YCbCr 4:2:0, 4:2:2, 4:1:1 and 1620 from one chroma form and plane layout to another; samples are moved, "
      "doubled or dropped, and averaged in four of them."},
+    {Family::hls, "hls", "HLS",
+     "RGB and BGR to hue, lightness and saturation and back: 8-bit, 16-bit and float samples, and planes of 8 bits."},
+    {Family::hsv, "hsv", "HSV", "RGB to hue, saturation and value and back, in 8-bit and 16-bit samples."},
     {Family::rgbYCbCr, "rgb-ycbcr", "RGB and YCbCr at full resolution",
      "8-bit RGB to BT.601 studio-range YCbCr and back, one chroma sample a pixel."},
     {Family::rgbYuv, "rgb-yuv", "RGB and YUV at full resolution",

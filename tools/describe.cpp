@@ -5,6 +5,7 @@
 #include "text.hpp"
 
 #include <algorithm>
+#include <bit>
 #include <sstream>
 
 namespace tool
@@ -85,7 +86,10 @@ std::string stepWords(const Side& side)
     case Steps::none:
         return "rows end to end";
     case Steps::one:
-        if (side.evenStep) return "a step, without its low bit";
+        if (side.stepUnit == 2) return "a step, without its low bit";
+        if (side.stepUnit > 2)
+            return "a step, without its low " + std::to_string(std::countr_zero(static_cast<unsigned>(side.stepUnit))) +
+                   " bits";
         return side.planes == 1 ? "a step" : "one step for all planes";
     default:
         return "a step for each plane";

@@ -11,6 +11,8 @@
 #include "pyxcc/filter_interlace.h"
 #include "pyxcc/gamma.h"
 #include "pyxcc/gray.h"
+#include "pyxcc/hls.h"
+#include "pyxcc/hsv.h"
 #include "pyxcc/repack.h"
 #include "pyxcc/rgb_to_subsampled.h"
 #include "pyxcc/rgb_ycbcr.h"

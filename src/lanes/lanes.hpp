@@ -2,6 +2,7 @@
 #pragma once
 
 #include "lanes/avx2/byte_curve.hpp"
+#include "lanes/avx2/choices.hpp"
 #include "lanes/avx2/control_word.hpp"
 #include "lanes/avx2/double_width.hpp"
 #include "lanes/avx2/doubles.hpp"
@@ -10,6 +11,7 @@
 #include "lanes/avx2/integers.hpp"
 #include "lanes/avx2/means.hpp"
 #include "lanes/avx2/pixels.hpp"
+#include "lanes/avx2/reciprocal.hpp"
 #include "lanes/avx2/samples.hpp"
 #include "lanes/scalar.hpp"
 #include "lanes/several.hpp"

@@ -6,9 +6,11 @@
 
 #include "lanes/groups.hpp"
 #include "lanes/inline.hpp"
+#include "lanes/several.hpp"
 #include "pyxcc/types.h"
 
 #include <algorithm>
+#include <array>
 #include <bit>
 #include <cmath>
 #include <concepts>
@@ -126,6 +128,11 @@ inline F32 greater(F32 x, F32 y) { return x.v > y.v ? x : y; }
 /// A NaN on either side gives y, or `no`.
 inline F64 greater(F64 x, F64 y) { return x.v > y.v ? x : y; }
 inline F64 whereLess(F64 x, F64 y, F64 yes, F64 no) { return x.v < y.v ? yes : no; }
+inline F32 whereLess(F32 x, F32 y, F32 yes, F32 no) { return x.v < y.v ? yes : no; }
+inline F32 whereAtMost(F32 x, F32 y, F32 yes, F32 no) { return x.v <= y.v ? yes : no; }
+inline F32 whereEqual(F32 x, F32 y, F32 yes, F32 no) { return x.v == y.v ? yes : no; }
+inline F32 whereSigned(F32 x, F32 yes, F32 no) { return std::signbit(x.v) ? yes : no; }
+inline F32 magnitude(F32 x) { return std::fabs(x.v); }
 inline S32 whereEqual(F32 x, F32 y, S32 yes, S32 no) { return x.v == y.v ? yes : no; }
 
 inline F64 sqrt(F64 x) { return std::sqrt(x.v); }
@@ -210,5 +217,33 @@ inline PixelWords pixelWords(S32 upperFirst, WordPair others) { return {upperFir
 
 inline PixelWords asPixelWords(const PixelWords& x) { return x; }
 inline PixelWords asPixelWords(const Three<S32>& upper) { return {upper.a, {(upper.b >> 16).v, (upper.c >> 16).v}}; }
+
+// Samples compared, chosen and looked up. Masks have all bits set, or none.
+
+inline U8 operator|(U8 x, U8 y) { return x.v | y.v; }
+inline U8 operator^(U8 x, U8 y) { return x.v ^ y.v; }
+inline U8 lesser(U8 x, U8 y) { return std::min(x.v, y.v); }
+inline U8 greater(U8 x, U8 y) { return std::max(x.v, y.v); }
+inline U8 distance(U8 x, U8 y) { return x.v > y.v ? x - y : y - x; }
+inline U8 mulHighU16(U8 x, int k) { return (x.v * k) >> 16; }
+
+template <class T> Lane<T> equal(Lane<T> x, Lane<T> y) { return x.v == y.v ? -1 : 0; }
+template <class T> Lane<T> where(Lane<T> mask, Lane<T> yes, Lane<T> no) { return mask.v ? yes : no; }
+template <class T> Lane<T> exceptWhere(Lane<T> mask, Lane<T> x) { return mask.v ? 0 : x; }
+
+inline U8 lookUp(const std::array<u8, 16>& table, U8 index) { return table[index.v]; }
+inline U16 lookUp(const std::array<u8, 16>& masks, U16 index) { return masks[index.v] * 0x0101; }
+inline F32 lookUp(const std::array<f32, 8>& table, S32 index) { return table[static_cast<u32>(index.v)]; }
+
+inline F32 whereOdd(S32 x, F32 yes, F32 no) { return x.v % 2 != 0 ? yes : no; }
+
+// In lanes of 32 bits, of which a register of samples makes several, and one sample makes one.
+
+template <class T> Several<S32, 1> toS32(Lane<T> x) { return several(S32(x.v)); }
+inline Several<S32, 1> differenceIn65536ths(U8 x, U8 y) { return several(S32((x.v - y.v) * 65536)); }
+template <class Samples> Samples saturate(const Several<S32, 1>& x)
+{
+    return saturate<decltype(Samples::v)>(x.part[0]);
+}
 
 } // namespace pyxcc::scalar

@@ -74,8 +74,7 @@ std::vector<Geometry> geometriesOf(const Side& side, RoiSize roi, Stride stride,
         const int step = side.steps == Steps::each   ? stepFor(stride, shape.rowBytes, sampleBytes, random)
                          : side.steps == Steps::none ? shape.rowBytes
                                                      : common;
-        Geometry& geometry =
-            geometries.emplace_back(geometryOf(shape, side.element, side.evenStep ? step & ~1 : step));
+        Geometry& geometry = geometries.emplace_back(geometryOf(shape, side.element, step & -side.stepUnit));
         const bool luma = plane == 0;
         addRows(geometry, luma ? beyond.lumaInFront : beyond.chromaInFront, luma ? 0 : beyond.chromaBehind);
     }
@@ -97,13 +96,13 @@ Image makeImage(const Side& side, const Recipe& recipe, Stride stride, const cat
     return image;
 }
 
-/// A low bit that does not count is set where the rows are to lie oddly.
+/// Low bits that do not count are set where the rows are to lie oddly.
 void hand(const Image& image, const Side& side, Stride stride, std::array<void*, 4>& planes, std::array<int, 4>& steps)
 {
-    const bool odd = side.evenStep && (stride == Stride::odd || stride == Stride::oddUp);
+    const bool odd = stride == Stride::odd || stride == Stride::oddUp;
     for (std::size_t i = 0; i < image.size(); ++i) {
         planes[i] = image[i].base();
-        steps[i] = image[i].geometry().step | int{odd};
+        steps[i] = image[i].geometry().step | (odd ? side.stepUnit - 1 : 0);
     }
 }
 

@@ -16,6 +16,7 @@ struct F32 {
 
     friend PYXCC_INLINE F32 operator+(F32 x, F32 y) { return F32(_mm256_add_ps(x.v, y.v)); }
     friend PYXCC_INLINE F32 operator-(F32 x, F32 y) { return F32(_mm256_sub_ps(x.v, y.v)); }
+    friend PYXCC_INLINE F32 operator-(F32 x) { return F32(-x.v); }
     friend PYXCC_INLINE F32 operator*(F32 x, F32 y) { return F32(_mm256_mul_ps(x.v, y.v)); }
     friend PYXCC_INLINE F32 operator/(F32 x, F32 y) { return F32(_mm256_div_ps(x.v, y.v)); }
 };
@@ -41,6 +42,18 @@ PYXCC_INLINE F64 fused(F64 x, F64 y, F64 z) { return F64(_mm256_fmadd_pd(x.v, y.
 /// x < y ? x : y, so that a NaN on either side gives y; and likewise for the greater.
 PYXCC_INLINE F32 lesser(F32 x, F32 y) { return F32(_mm256_min_ps(x.v, y.v)); }
 PYXCC_INLINE F32 greater(F32 x, F32 y) { return F32(_mm256_max_ps(x.v, y.v)); }
+
+/// x < y ? yes : no, so that a NaN on either side gives `no`; and likewise for the other comparisons. The compiler's
+/// own comparisons let several choices share one.
+PYXCC_INLINE F32 whereLess(F32 x, F32 y, F32 yes, F32 no) { return F32(x.v < y.v ? yes.v : no.v); }
+PYXCC_INLINE F32 whereAtMost(F32 x, F32 y, F32 yes, F32 no) { return F32(x.v <= y.v ? yes.v : no.v); }
+PYXCC_INLINE F32 whereEqual(F32 x, F32 y, F32 yes, F32 no) { return F32(x.v == y.v ? yes.v : no.v); }
+
+/// By the sign bit, which a zero can have as well.
+PYXCC_INLINE F32 whereSigned(F32 x, F32 yes, F32 no) { return F32(_mm256_blendv_ps(no.v, yes.v, x.v)); }
+
+/// Without its sign.
+PYXCC_INLINE F32 magnitude(F32 x) { return F32(_mm256_andnot_ps(_mm256_set1_ps(-0.f), x.v)); }
 
 PYXCC_INLINE F32 toF32(S32 x) { return F32(_mm256_cvtepi32_ps(x.v)); }
 
