@@ -39,6 +39,7 @@ enum class Family {
     filterInterlace,
     ycocg,
     cbycr422,
+    toneMap,
 };
 
 struct FamilyInfo {

@@ -47,6 +47,8 @@ constexpr FamilyInfo table[] = {
     {Family::cbycr422, "cbycr422", "Packed CbYCr 4:2:2",
      "8-bit RGB to the packed 4:2:2 form with chroma first and back by BT.601, with a gamma-corrected one, and other "
      "YCbCr forms to it and back."},
+    {Family::toneMap, "tone-map", "Tone mapping",
+     "Floats of any range to 8 bits, by a scale that comes from the image's largest sample or from its mean."},
 };
 
 } // namespace

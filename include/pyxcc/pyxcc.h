@@ -19,6 +19,7 @@
 #include "pyxcc/rgb_yuv.h"
 #include "pyxcc/rgb_yuv_subsampled.h"
 #include "pyxcc/subsampled_to_rgb.h"
+#include "pyxcc/tone_map.h"
 #include "pyxcc/types.h"
 #include "pyxcc/version.h"
 #include "pyxcc/xyz_ycc.h"

@@ -46,6 +46,18 @@ template <int PixelBytes> struct BytesAsWords {
     static PYXCC_INLINE Two<Three<wide::Sample>> load(const u8* p) { return loadAsWords<PixelBytes>(p); }
 };
 
+/// Floats on the way to bytes: as many registers as fill one of bytes.
+struct FloatsForBytes {
+    using Samples = wide::U8;
+    static constexpr int pixelBytes = 4;
+
+    static PYXCC_INLINE Four<wide::F32> load(const u8* p)
+    {
+        return {loadSamples<wide::F32>(p), loadSamples<wide::F32>(p + 32), loadSamples<wide::F32>(p + 64),
+                loadSamples<wide::F32>(p + 96)};
+    }
+};
+
 /// Luma and chroma bytes in turn, of which the luma is taken.
 struct LumaOfC2 {
     using Samples = wide::U8;
@@ -81,5 +93,9 @@ inline auto ac4AsWords(const u8* first, std::ptrdiff_t step)
 }
 
 inline auto lumaOfC2(const u8* first, std::ptrdiff_t step) { return detail::interleaved(first, step, LumaOfC2{}); }
+
+/// A row of floats for bytesOfFloats(), which takes what they are narrowed to.
+inline auto floatsForBytes(const u8* row) { return InterleavedRow<FloatsForBytes, const u8>{row, {}}; }
+inline auto bytesOfFloats(u8* row) { return InterleavedRow<C1<wide::U8, Order::any>, u8>{row, {}}; }
 
 } // namespace pyxcc::layouts

@@ -1,0 +1,97 @@
+#include "tone/tone_map_statistics.hpp"
+
+#include "lanes/lanes.hpp"
+#include "layouts/avx2/interleave.hpp"
+#include "layouts/bytes.hpp"
+
+#include <cstring>
+#include <limits>
+
+namespace pyxcc::tone
+{
+
+namespace
+{
+
+/// So many registers at once that none waits for its sum or its comparison.
+constexpr int registers = 4;
+constexpr int block = registers * wide::F32::count;
+using Block = Several<wide::F32, registers>;
+using Sums = Several<wide::F64, 2 * registers>;
+
+PYXCC_INLINE Block loadBlock(const u8* row, int x)
+{
+    const u8* const p = row + std::ptrdiff_t{x} * 4;
+    layouts::expectFrom<4096>(p);
+    Block samples;
+    for (int i = 0; i < registers; ++i) samples.part[i] = layouts::loadSamples<wide::F32>(p + 32 * i);
+    return samples;
+}
+
+f32 sampleAt(const u8* row, int x)
+{
+    f32 sample;
+    std::memcpy(&sample, row + std::ptrdiff_t{x} * 4, sizeof sample);
+    return sample;
+}
+
+f32 largerOrLater(f32 level, f32 sample) { return level > sample ? level : sample; }
+
+/// The largest of the row's whole blocks in `level`, unless a sample is infinite or NaN.
+bool largestOfBlocks(const u8* row, int width, f32& level)
+{
+    Block best(std::numeric_limits<f32>::lowest()), zeros(0.0f);
+    for (int x = 0; x <= width - block; x += block) {
+        const Block samples = loadBlock(row, x);
+        best = greater(best, samples);
+        zeros = fused(samples, Block(0.0f), zeros); // NaN from the first such sample on
+    }
+    f32 lanes[block], checks[block];
+    std::memcpy(lanes, &best, sizeof lanes);
+    std::memcpy(checks, &zeros, sizeof checks);
+    for (int i = 0; i < block; ++i) {
+        if (!(checks[i] == 0)) return false;
+        level = largerOrLater(level, lanes[i]);
+    }
+    return true;
+}
+
+f32 largestOfRow(const u8* row, int width, f32 level)
+{
+    f32 ofBlocks = level;
+    int x = 0;
+    if (width >= block && largestOfBlocks(row, width, ofBlocks)) {
+        level = ofBlocks;
+        x = width & ~(block - 1);
+    }
+    for (; x < width; ++x) level = largerOrLater(level, sampleAt(row, x));
+    return level;
+}
+
+} // namespace
+
+f32 largestSample(const f32* src, int srcStep, RoiSize roi)
+{
+    f32 level = std::numeric_limits<f32>::lowest();
+    for (int y = 0; y < roi.height; ++y)
+        level = largestOfRow(layouts::rowAt(layouts::bytes(src), srcStep, y), roi.width, level);
+    return level;
+}
+
+f64 sumOfSamples(const f32* src, int srcStep, RoiSize roi)
+{
+    Sums sums(0.0);
+    f64 sum = 0;
+    for (int y = 0; y < roi.height; ++y) {
+        const u8* const row = layouts::rowAt(layouts::bytes(src), srcStep, y);
+        int x = 0;
+        for (; x <= roi.width - block; x += block) sums = sums + toF64(loadBlock(row, x));
+        for (; x < roi.width; ++x) sum += static_cast<f64>(sampleAt(row, x));
+    }
+    f64 lanes[block];
+    std::memcpy(lanes, &sums, sizeof lanes);
+    for (const f64 lane : lanes) sum += lane;
+    return sum;
+}
+
+} // namespace pyxcc::tone
