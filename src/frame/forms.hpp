@@ -12,6 +12,10 @@ namespace pyxcc::frame
 struct OnWords {
 };
 
+/// One whose results are luma and what two chroma samples add to it, clamped to a byte.
+struct AddedToLuma : OnWords {
+};
+
 template <std::derived_from<wide::Byte> Byte> PYXCC_INLINE wide::U8 narrowAll(Byte low, Byte high)
 {
     return narrow(low, high);

@@ -57,4 +57,16 @@ PYXCC_INLINE auto apply(const Form& form, const layouts::ChromaOfPairs<Luma>& pi
     }
 }
 
+/// Two rows share what it takes to add in bytes, where the results are clamped for nothing.
+template <std::derived_from<AddedToLuma> Form>
+PYXCC_INLINE auto apply(const Form&, const layouts::ChromaOfPairs<Two<wide::U8>>& pixels)
+{
+    const Three<wide::S16> shares = Form::shares(pixels.chroma.a, pixels.chroma.b);
+    const auto a = layouts::inBytes(shares.a), b = layouts::inBytes(shares.b), c = layouts::inBytes(shares.c);
+    const auto row = [&](wide::U8 luma) PYXCC_INLINE_LAMBDA {
+        return Three{addTo(luma, a), addTo(luma, b), addTo(luma, c)};
+    };
+    return Two{row(pixels.luma.a), row(pixels.luma.b)};
+}
+
 } // namespace pyxcc::frame

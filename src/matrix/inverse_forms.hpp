@@ -36,18 +36,6 @@ template <int Zero, int Weight> struct HighLuma {
     template <class Word> static PYXCC_INLINE auto scaled(const Word& Y) { return highShare<Zero, Weight>(Y); }
 };
 
-/// Luma of full range, in 1 << Bits parts of a step.
-template <int Bits> struct WholeLuma {
-    template <class Word> static PYXCC_INLINE auto scaled(const Word& Y)
-    {
-        if constexpr (Bits == 0) {
-            return Y;
-        } else {
-            return Y << Bits;
-        }
-    }
-};
-
 /// Weights of the high products; those of G are taken as the form below has them, added or taken off.
 struct HighWeights {
     int crToR, cbToG, crToG, cbToB;
@@ -83,7 +71,7 @@ template <HighWeights k, Three<int> Offsets> struct ChromaOffset {
     }
 };
 
-/// Exact sums, of which whole steps of luma take no part: what is added is that to the channels.
+/// Exact sums; what is added is that to the channels.
 template <HighWeights k, Three<int> Addends> struct ChromaExactly {
     template <class Word> static PYXCC_INLINE auto shares(const Word& Cb, const Word& Cr)
     {
@@ -92,6 +80,25 @@ template <HighWeights k, Three<int> Addends> struct ChromaExactly {
                      exactShare<128, k.cbToB, Addends.c>(Cb)};
     }
 };
+
+namespace detail
+{
+
+/// (x + Rounding) >> Shift, in the cheapest way.
+template <int Rounding, int Shift, class Sum> PYXCC_INLINE auto inSteps(const Sum& x)
+{
+    if constexpr (Shift == 0) {
+        return x;
+    } else if constexpr (Rounding == 0) {
+        return x >> Shift;
+    } else if constexpr (Rounding == 1 << (Shift - 1)) {
+        return roundedShift<Shift>(x);
+    } else {
+        return (x + Rounding) >> Shift;
+    }
+}
+
+} // namespace detail
 
 template <class Luma, class Chroma, int Rounding, int Shift> struct InvHigh : frame::OnWords, Chroma {
     template <class Word, class Share> static PYXCC_INLINE auto add(const Word& Y, const Three<Share>& chroma)
@@ -108,13 +115,27 @@ template <class Luma, class Chroma, int Rounding, int Shift> struct InvHigh : fr
 private:
     template <class Sum> static PYXCC_INLINE auto rounded(const Sum& sum)
     {
-        if constexpr (Shift == 0) {
-            return sat8(sum);
-        } else if constexpr (Rounding == 1 << (Shift - 1)) {
-            return sat8(roundedShift<Shift>(sum));
-        } else {
-            return sat8((sum + Rounding) >> Shift);
-        }
+        return sat8(detail::inSteps<Rounding, Shift>(sum));
+    }
+};
+
+/// Luma of full range is whole steps, which come through the rounding as they are: what is rounded is what chroma adds.
+template <class Chroma, int Rounding, int Shift> struct InvFullRange : frame::AddedToLuma {
+    template <class Word> static PYXCC_INLINE auto shares(const Word& Cb, const Word& Cr)
+    {
+        const auto share = Chroma::shares(Cb, Cr);
+        return Three{detail::inSteps<Rounding, Shift>(share.a), detail::inSteps<Rounding, Shift>(share.b),
+                     detail::inSteps<Rounding, Shift>(share.c)};
+    }
+
+    template <class Word, class Share> static PYXCC_INLINE auto add(const Word& Y, const Three<Share>& chroma)
+    {
+        return Three{sat8(Y + chroma.a), sat8(Y + chroma.b), sat8(Y + chroma.c)};
+    }
+
+    template <class Word> PYXCC_INLINE auto operator()(const Word& Y, const Word& Cb, const Word& Cr) const
+    {
+        return add(Y, shares(Cb, Cr));
     }
 };
 

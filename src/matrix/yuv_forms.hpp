@@ -68,12 +68,10 @@ struct YuvFwdPlanar : frame::OnWords {
     }
 };
 
-// Luma is whole steps in the inverse, so that in the exact forms it adds to what chroma does, sum by sum.
-
 inline constexpr HighWeights yuvInverse{74711, -25821, -38076, 133169};
 inline constexpr HighWeights yuvInverseLess{74710, -25820, -38075, 133168};
 template <HighWeights k, int ToR, int ToG, int ToB>
-using YuvInvExact = InvHigh<WholeLuma<0>, ChromaExactly<k, Three{ToR, ToG, ToB}>, 0, 0>;
+using YuvInvExact = InvFullRange<ChromaExactly<k, Three{ToR, ToG, ToB}>, 0, 0>;
 
 using YuvInvExactA = YuvInvExact<yuvInverse, 32768, 0, 32768>; // rounds but in G
 using YuvInvExactB = YuvInvExact<yuvInverseLess, 0, 0, 0>;     // truncates
@@ -81,11 +79,11 @@ using YuvInvExactC = YuvInvExact<yuvInverse, 32768, 32768, 32768>;
 using YuvInvExactD = YuvInvExact<yuvInverse, 0, 0, 0>;
 
 /// In whole steps, halves, eighths and sixteenths.
-using YuvInvHigh3 = InvHigh<WholeLuma<0>, ChromaAdded<HighWeights{9339, -3228, -4760, 16646}, 3>, 0, 0>;
-using YuvInvHigh4 = InvHigh<WholeLuma<1>, ChromaAdded<HighWeights{9338, -3227, -4759, 16645}, 4>, 0, 1>;
-using YuvInvHigh4x = InvHigh<WholeLuma<1>, ChromaAdded<HighWeights{9339, -3228, -4760, 16646}, 4>, 0, 1>;
-using YuvInvHigh7 = InvHigh<WholeLuma<3>, ChromaTakenOff<HighWeights{4669, 1614, 2380, 8323}>, 4, 3>;
-using YuvInvHigh8 = InvHigh<WholeLuma<4>, ChromaTakenOff<HighWeights{9338, 3227, 4759, 16646}>, 8, 4>;
+using YuvInvHigh3 = InvFullRange<ChromaAdded<HighWeights{9339, -3228, -4760, 16646}, 3>, 0, 0>;
+using YuvInvHigh4 = InvFullRange<ChromaAdded<HighWeights{9338, -3227, -4759, 16645}, 4>, 0, 1>;
+using YuvInvHigh4x = InvFullRange<ChromaAdded<HighWeights{9339, -3228, -4760, 16646}, 4>, 0, 1>;
+using YuvInvHigh7 = InvFullRange<ChromaTakenOff<HighWeights{4669, 1614, 2380, 8323}>, 4, 3>;
+using YuvInvHigh8 = InvFullRange<ChromaTakenOff<HighWeights{9338, 3227, 4759, 16646}>, 8, 4>;
 
 inline constexpr YuvFwdExactA yuvFwdExactA;
 inline constexpr YuvFwdExactB yuvFwdExactB;

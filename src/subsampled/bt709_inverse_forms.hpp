@@ -18,6 +18,6 @@ using InvHighStudio = InvHigh<HighLuma<16, 9535>, ChromaTakenOff<HighWeights{146
 
 // Full range, rounding.
 using InvExactHdtv = InvExact<hdtvInverse, from128(hdtvInverse, 32768)>;
-using InvHighHdtv = InvHigh<WholeLuma<4>, ChromaTakenOff<HighWeights{12616, 1499, 3760, 14877}>, 8, 4>;
+using InvHighHdtv = InvFullRange<ChromaTakenOff<HighWeights{12616, 1499, 3760, 14877}>, 8, 4>;
 
 } // namespace pyxcc::subsampled::bt709

@@ -7,8 +7,8 @@
 namespace forms
 {
 
-/// All 2^24 triples, as pairs of rows: 16 values of Cb, each shared by two columns of both rows; Y in one row counts up
-/// as the blocks do, in the other it counts down.
+/// All 2^24 triples, as pairs of rows and as rows by themselves: 16 values of Cb, each shared by two columns of both
+/// rows; Y in one row counts up as the blocks do, in the other it counts down.
 template <class Form> void expectSharedInstancesAgree(const Form& form)
 {
     using pyxcc::layouts::loadForPairs;
@@ -33,11 +33,13 @@ template <class Form> void expectSharedInstancesAgree(const Form& form)
             cr.fill(static_cast<u8>(crOfAll));
             for (int firstCb = 0; firstCb < 256; firstCb += pairs) {
                 for (int i = 0; i < pairs; ++i) cb[i] = static_cast<u8>(firstCb + i);
-                const pyxcc::layouts::ChromaOfPairs<pyxcc::Two<U8>> pixels{
-                    {U8(y), U8(255 - y)}, {loadForPairs<2>(cb.data()), loadForPairs<2>(cr.data())}};
-                const auto rows = apply(form, pixels);
+                const pyxcc::Two chroma{loadForPairs<2>(cb.data()), loadForPairs<2>(cr.data())};
+                const pyxcc::layouts::ChromaOfPairs<pyxcc::Two<U8>> pairOfRows{{U8(y), U8(255 - y)}, chroma};
+                const auto rows = apply(form, pairOfRows);
                 ASSERT_NO_FATAL_FAILURE(expectRow(rows.a, y));
                 ASSERT_NO_FATAL_FAILURE(expectRow(rows.b, 255 - y));
+                const pyxcc::layouts::ChromaOfPairs<U8> row{U8(y), chroma};
+                ASSERT_NO_FATAL_FAILURE(expectRow(apply(form, row), y));
             }
         }
     }

@@ -94,6 +94,10 @@ struct InLumaFirst {
     }
 };
 
+struct InLumaFirstAlone : InLumaFirst {
+    static auto image(const Pointers& at, const Steps& steps) { return layouts::c2LumaFirstAlone(at[0], steps[0]); }
+};
+
 struct InExchangedLumaFirst : InLumaFirst {
     static auto image(const Pointers& at, const Steps& steps) { return chromaExchanged(InLumaFirst::image(at, steps)); }
     static Pixel pixel(int x, int width)
@@ -180,13 +184,13 @@ private:
 struct Names {
     template <class Layout> static std::string GetName(int i)
     {
-        return std::array{"P3Halves",    "P3HalvesExchanged", "P3Quarters",           "P2",
-                          "P2Exchanged", "C2LumaFirst",       "C2LumaFirstExchanged", "C2ChromaFirst"}[i];
+        return std::array{"P3Halves",    "P3HalvesExchanged", "P3Quarters",           "P2",           "P2Exchanged",
+                          "C2LumaFirst", "C2LumaFirstAlone",  "C2LumaFirstExchanged", "C2ChromaFirst"}[i];
     }
 };
 
 using Layouts = testing::Types<InHalfPlanes, InExchangedHalfPlanes, InQuarterPlanes, InPairs, InExchangedPairs,
-                               InLumaFirst, InExchangedLumaFirst, InChromaFirst>;
+                               InLumaFirst, InLumaFirstAlone, InExchangedLumaFirst, InChromaFirst>;
 TYPED_TEST_SUITE(SharedChroma, Layouts, Names);
 
 /// Widths from 4, the least that all of the layouts have.
@@ -219,6 +223,11 @@ constexpr std::array<u8, 3> onePixel = {7, 100, 50}; // behind a byte before the
 TEST(SharedChromaOfOnePixel, LumaFirstTakesTheByteBefore)
 {
     EXPECT_EQ(loadOnePixel(layouts::c2LumaFirst(&onePixel[1], 0)), (std::array{100, 50, 7}));
+}
+
+TEST(SharedChromaOfOnePixel, LumaFirstAloneTakesThatOfGray)
+{
+    EXPECT_EQ(loadOnePixel(layouts::c2LumaFirstAlone(&onePixel[1], 0)), (std::array{100, 50, 128}));
 }
 
 TEST(SharedChromaOfOnePixel, ChromaFirstTakesItsOwn)

@@ -95,19 +95,21 @@ template <class Row, class Pixels> void storeColumns(const Row& row, int count, 
     }
 }
 
-template <int Columns, Order order> void expectInPlanes(int count, bool exchanged)
+template <int Columns, Order order, Rest rest = Rest::lumaOnly> void expectInPlanes(int count, bool exchanged)
 {
     constexpr int width = before + block + 8;
     Plane y{width, 2}, first{width / Columns, 3}, second{width / Columns + 5, 3};
     u8* const planes[3] = {y.bytes.data(), first.bytes.data(), second.bytes.data()};
     const int steps[3] = {y.rowBytes, first.rowBytes, second.rowBytes};
-    const auto image = p3<Columns, order>(planes, steps);
-    if (exchanged) {
+    const auto image = p3<Columns, order, rest>(planes, steps);
+    if constexpr (rest == Rest::withChroma) {
+        storeColumns(image.row(1), count, oneRow<Columns, order>());
+    } else if (exchanged) {
         storeColumns(chromaExchanged(image).row(1), count, oneRow<Columns, order>());
     } else {
         storeColumns(image.row(1), count, oneRow<Columns, order>());
     }
-    const int samples = count / Columns;
+    const int samples = rest == Rest::withChroma ? (count + Columns - 1) / Columns : count / Columns;
     EXPECT_EQ(y.row(0), Samples(y.rowBytes, untouched));
     EXPECT_EQ(y.row(1), rowWith(before, upFrom(1, count), y.rowBytes));
     const auto& [a, b] = exchanged ? std::pair(second, first) : std::pair(first, second);
@@ -202,6 +204,12 @@ TEST(SharedChromaTargets, PlanesWithASampleForFourColumns)
         eachCount([=](int count) { expectInPlanes<4, Order::ofMemory>(count, exchanged); },
                   [=](int count) { expectInPlanes<4, Order::any>(count, exchanged); });
     }
+}
+
+TEST(SharedChromaTargets, PlanesWithASampleForALastOddColumn)
+{
+    eachCount([](int count) { expectInPlanes<2, Order::ofMemory, Rest::withChroma>(count, false); },
+              [](int count) { expectInPlanes<2, Order::any, Rest::withChroma>(count, false); });
 }
 
 TEST(SharedChromaTargets, PairsOfRowsShareOneRowOfChroma)

@@ -86,6 +86,23 @@ PYXCC_INLINE Two<wide::S16> doubled(wide::S16 x)
     return {wide::S16(_mm256_unpacklo_epi16(x.v, x.v)), wide::S16(_mm256_unpackhi_epi16(x.v, x.v))};
 }
 
+/// What is to be added to each of 32 bytes and what is to be taken off; one of the two is zero.
+struct Changes {
+    wide::U8 plus, minus;
+};
+
+/// A word for two neighbours each, as changes.
+PYXCC_INLINE Changes inBytes(wide::S16 x)
+{
+    const __m256i both = _mm256_packus_epi16(x.v, (wide::S16(0) - x).v);
+    return {wide::U8(_mm256_unpacklo_epi8(both, both)), wide::U8(_mm256_unpackhi_epi8(both, both))};
+}
+
+PYXCC_INLINE wide::U8 addTo(wide::U8 x, const Changes& changes)
+{
+    return wide::U8(_mm256_subs_epu8(_mm256_adds_epu8(x.v, changes.plus.v), changes.minus.v));
+}
+
 /// Each byte twice, in order.
 PYXCC_INLINE wide::U8 doubled(HalfBlock x)
 {
