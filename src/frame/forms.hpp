@@ -37,6 +37,18 @@ template <std::derived_from<OnWords> Form> PYXCC_INLINE auto apply(const Form& f
     return narrowAll(form(a.a, b.a, c.a), form(a.b, b.b, c.b));
 }
 
+/// A form that has another way for bytes, which is less work than to widen them.
+template <class Form>
+concept AlsoOfBytes = std::derived_from<Form, OnWords> && requires(wide::U8 x)
+{
+    Form::ofBytes(x, x, x);
+};
+
+template <AlsoOfBytes Form> PYXCC_INLINE auto apply(const Form&, const Three<wide::U8>& pixels)
+{
+    return Form::ofBytes(pixels.a, pixels.b, pixels.c);
+}
+
 /// A form over three samples of pixels of four, the fourth of which goes along as it is.
 template <class Form> struct WithFourth {
     Form form;

@@ -57,6 +57,18 @@ PYXCC_INLINE auto apply(const Form& form, const layouts::ChromaOfPairs<Luma>& pi
     }
 }
 
+/// One row adds it to its even columns and to its odd ones, which saves laying it beside them.
+template <std::derived_from<AddedToLuma> Form>
+PYXCC_INLINE auto apply(const Form&, const layouts::ChromaOfPairs<wide::U8>& pixels)
+{
+    const Three<wide::S16> shares = Form::shares(pixels.chroma.a, pixels.chroma.b);
+    const wide::S16 even = layouts::lowBytes(pixels.luma), odd = layouts::highBytes(pixels.luma);
+    const auto channel = [&](wide::S16 share) PYXCC_INLINE_LAMBDA {
+        return layouts::inTurn(layouts::narrowPairs(Two{sat8(even + share), sat8(odd + share)}));
+    };
+    return Three{channel(shares.a), channel(shares.b), channel(shares.c)};
+}
+
 /// Two rows share what it takes to add in bytes, where the results are clamped for nothing.
 template <std::derived_from<AddedToLuma> Form>
 PYXCC_INLINE auto apply(const Form&, const layouts::ChromaOfPairs<Two<wide::U8>>& pixels)

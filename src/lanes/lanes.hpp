@@ -2,6 +2,7 @@
 #pragma once
 
 #include "lanes/avx2/byte_curve.hpp"
+#include "lanes/avx2/byte_sum.hpp"
 #include "lanes/avx2/choices.hpp"
 #include "lanes/avx2/control_word.hpp"
 #include "lanes/avx2/double_width.hpp"

@@ -53,6 +53,13 @@ template <Weights k, int Addend, Clamp ends = Clamp{}> struct LumaExact : frame:
     {
         return detail::clamped<ends>(exactSum<16, Addend, k.r, k.g, k.b>(R, G, B));
     }
+
+    static PYXCC_INLINE wide::U8 ofBytes(wide::U8 R, wide::U8 G,
+                                         wide::U8 B) requires(ends.low == 0 && ends.high == 255 &&
+                                                              wide::sumsByBytes<Addend, k.r, k.g, k.b>)
+    {
+        return wide::exactSumOfBytes<Addend, k.r, k.g, k.b>(R, G, B);
+    }
 };
 
 /// High halves of 16-bit products, each truncated by itself.
