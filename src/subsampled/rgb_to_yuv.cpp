@@ -4,6 +4,7 @@
 #include "frame/checks.hpp"
 #include "frame/row_driver.hpp"
 #include "layouts/shared_chroma.hpp"
+#include "subsampled/row_pairs.hpp"
 #include "subsampled/tight_images.hpp"
 #include "subsampled/wide_spans.hpp"
 #include "subsampled/yuv_forms.hpp"
@@ -20,12 +21,6 @@ namespace
 template <class Source, class Target> PyxStatus rounded420(RoiSize roi, const Source& source, const Target& target)
 {
     eachRowPair(roi, source, target, spans(upTo<blocksOf<8>, wholePairs>, yuv420Round, yuv420Exact14));
-    return warnIfOff(roi, 2, 2);
-}
-
-template <class Source, class Target> PyxStatus exact420(RoiSize roi, const Source& source, const Target& target)
-{
-    eachRowPair(roi, source, target, spans(upTo<wholePairs>, yuv420Exact16));
     return warnIfOff(roi, 2, 2);
 }
 
@@ -69,7 +64,7 @@ PyxStatus PYXCC_CALL pyxiRGBToYUV420_8u_P3R(const u8* const src[3], int srcStep,
     if (const PyxStatus failure =
             firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1), elementsNotNull<3>(src), elementsNotNull<3>(dst)))
         return failure;
-    return exact420(roi, p3(src, srcStep), p3<2>(dst, dstStep));
+    return wholeBlocks(roi, p3(src, srcStep), p3<2>(dst, dstStep), yuv420Exact16);
 }
 
 PyxStatus PYXCC_CALL pyxiRGBToYUV420_8u_P3(const u8* const src[3], u8* const dst[3], RoiSize roi)
@@ -77,7 +72,7 @@ PyxStatus PYXCC_CALL pyxiRGBToYUV420_8u_P3(const u8* const src[3], u8* const dst
     if (const PyxStatus failure =
             firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1), elementsNotNull<3>(src), elementsNotNull<3>(dst)))
         return failure;
-    return exact420(roi, p3(src, roi.width), p3<2>(dst, stepsOf420(roi.width).data()));
+    return wholeBlocks(roi, p3(src, roi.width), p3<2>(dst, stepsOf420(roi.width).data()), yuv420Exact16);
 }
 
 PyxStatus PYXCC_CALL pyxiBGRToYUV420_8u_AC4P3R(const u8* src, int srcStep, u8* const dst[3], const int dstStep[3],
@@ -85,7 +80,7 @@ PyxStatus PYXCC_CALL pyxiBGRToYUV420_8u_AC4P3R(const u8* src, int srcStep, u8* c
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1), elementsNotNull<3>(dst)))
         return failure;
-    return exact420(roi, reversed(ac4<Order::any>(src, srcStep)), p3<2, Order::any>(dst, dstStep));
+    return wholeBlocks(roi, reversed(ac4<Order::any>(src, srcStep)), p3<2, Order::any>(dst, dstStep), yuv420Exact16);
 }
 
 PyxStatus PYXCC_CALL pyxiRGBToYUV422_8u_C3C2R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)

@@ -6,7 +6,7 @@
 #include "frame/shared_chroma_forms.hpp"
 #include "layouts/shared_chroma.hpp"
 #include "matrix/bt601_forms.hpp"
-#include "subsampled/wide_spans.hpp"
+#include "subsampled/row_pairs.hpp"
 
 using namespace pyxcc::frame;
 using namespace pyxcc::layouts;
@@ -15,14 +15,6 @@ using namespace pyxcc::subsampled;
 
 namespace
 {
-
-/// All whole blocks in one form.
-template <class Source, class Target, class Form>
-PyxStatus inOneForm(RoiSize roi, const Source& source, const Target& target, Form form)
-{
-    eachRowPair(roi, source, target, spans(upTo<wholePairs>, form));
-    return warnIfOff(roi, 2, 2);
-}
 
 /// Blocks of `Block` columns in the wide form, the rest of the whole pairs in an exact one.
 template <int Block, class Source, class Target, class Wide>
@@ -38,35 +30,36 @@ PyxStatus PYXCC_CALL pyxiYCbCr420ToBGR_8u_P2C3R(const u8* srcY, int srcYStep, co
                                                 u8* dst, int dstStep, RoiSize roi)
 {
     if (const PyxStatus failure = firstFailure(notNull(srcY, srcCbCr, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return inOneForm(roi, p2(srcY, srcYStep, srcCbCr, srcCbCrStep), reversed(c3(dst, dstStep)), inv3A);
+    return wholeBlocks(roi, p2(srcY, srcYStep, srcCbCr, srcCbCrStep), reversed(c3(dst, dstStep)), inv3A);
 }
 
 PyxStatus PYXCC_CALL pyxiYCbCr420ToBGR_8u_P2C4R(const u8* srcY, int srcYStep, const u8* srcCbCr, int srcCbCrStep,
                                                 u8* dst, int dstStep, RoiSize roi, u8 aval)
 {
     if (const PyxStatus failure = firstFailure(notNull(srcY, srcCbCr, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return inOneForm(roi, p2(srcY, srcYStep, srcCbCr, srcCbCrStep), reversed(c4(dst, dstStep, aval)), inv3A);
+    return wholeBlocks(roi, p2(srcY, srcYStep, srcCbCr, srcCbCrStep), reversed(c4(dst, dstStep, aval)), inv3A);
 }
 
 PyxStatus PYXCC_CALL pyxiYCbCr420ToRGB_8u_P2C3R(const u8* srcY, int srcYStep, const u8* srcCbCr, int srcCbCrStep,
                                                 u8* dst, int dstStep, RoiSize roi)
 {
     if (const PyxStatus failure = firstFailure(notNull(srcY, srcCbCr, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return inOneForm(roi, p2(srcY, srcYStep, srcCbCr, srcCbCrStep), c3(dst, dstStep), inv3A);
+    return wholeBlocks(roi, p2(srcY, srcYStep, srcCbCr, srcCbCrStep), c3(dst, dstStep), inv3A);
 }
 
 PyxStatus PYXCC_CALL pyxiYCbCr420ToRGB_8u_P2C4R(const u8* srcY, int srcYStep, const u8* srcCbCr, int srcCbCrStep,
                                                 u8* dst, int dstStep, RoiSize roi, u8 aval)
 {
     if (const PyxStatus failure = firstFailure(notNull(srcY, srcCbCr, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return inOneForm(roi, p2(srcY, srcYStep, srcCbCr, srcCbCrStep), c4(dst, dstStep, aval), inv3A);
+    return wholeBlocks(roi, p2(srcY, srcYStep, srcCbCr, srcCbCrStep), c4(dst, dstStep, aval), inv3A);
 }
 
 PyxStatus PYXCC_CALL pyxiYCrCb420ToBGR_8u_P2C3R(const u8* srcY, int srcYStep, const u8* srcCbCr, int srcCbCrStep,
                                                 u8* dst, int dstStep, RoiSize roi)
 {
     if (const PyxStatus failure = firstFailure(notNull(srcY, srcCbCr, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return inOneForm(roi, chromaExchanged(p2(srcY, srcYStep, srcCbCr, srcCbCrStep)), reversed(c3(dst, dstStep)), inv3B);
+    return wholeBlocks(roi, chromaExchanged(p2(srcY, srcYStep, srcCbCr, srcCbCrStep)), reversed(c3(dst, dstStep)),
+                       inv3B);
 }
 
 /// The size is tested before the pointers.
@@ -74,15 +67,15 @@ PyxStatus PYXCC_CALL pyxiYCrCb420ToBGR_8u_P2C4R(const u8* srcY, int srcYStep, co
                                                 u8* dst, int dstStep, RoiSize roi, u8 aval)
 {
     if (const PyxStatus failure = firstFailure(sizeAtLeast(roi, 1, 1), notNull(srcY, srcCbCr, dst))) return failure;
-    return inOneForm(roi, chromaExchanged(p2(srcY, srcYStep, srcCbCr, srcCbCrStep)), reversed(c4(dst, dstStep, aval)),
-                     inv3B);
+    return wholeBlocks(roi, chromaExchanged(p2(srcY, srcYStep, srcCbCr, srcCbCrStep)), reversed(c4(dst, dstStep, aval)),
+                       inv3B);
 }
 
 PyxStatus PYXCC_CALL pyxiYCrCb420ToRGB_8u_P2C3R(const u8* srcY, int srcYStep, const u8* srcCbCr, int srcCbCrStep,
                                                 u8* dst, int dstStep, RoiSize roi)
 {
     if (const PyxStatus failure = firstFailure(notNull(srcY, srcCbCr, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return inOneForm(roi, chromaExchanged(p2(srcY, srcYStep, srcCbCr, srcCbCrStep)), c3(dst, dstStep), inv3B);
+    return wholeBlocks(roi, chromaExchanged(p2(srcY, srcYStep, srcCbCr, srcCbCrStep)), c3(dst, dstStep), inv3B);
 }
 
 /// The size is tested before the pointers.
@@ -90,7 +83,7 @@ PyxStatus PYXCC_CALL pyxiYCrCb420ToRGB_8u_P2C4R(const u8* srcY, int srcYStep, co
                                                 u8* dst, int dstStep, RoiSize roi, u8 aval)
 {
     if (const PyxStatus failure = firstFailure(sizeAtLeast(roi, 1, 1), notNull(srcY, srcCbCr, dst))) return failure;
-    return inOneForm(roi, chromaExchanged(p2(srcY, srcYStep, srcCbCr, srcCbCrStep)), c4(dst, dstStep, aval), inv3B);
+    return wholeBlocks(roi, chromaExchanged(p2(srcY, srcYStep, srcCbCr, srcCbCrStep)), c4(dst, dstStep, aval), inv3B);
 }
 
 PyxStatus PYXCC_CALL pyxiYCbCr420ToBGR_8u_P3C3R(const u8* const src[3], const int srcStep[3], u8* dst, int dstStep,
@@ -106,7 +99,7 @@ PyxStatus PYXCC_CALL pyxiYCbCr420ToBGR_8u_P3C4R(const u8* const src[3], const in
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1), elementsNotNull<3>(src)))
         return failure;
-    return inOneForm(roi, p3<2>(src, srcStep), reversed(c4(dst, dstStep, aval)), inv3A);
+    return wholeBlocks(roi, p3<2>(src, srcStep), reversed(c4(dst, dstStep, aval)), inv3A);
 }
 
 PyxStatus PYXCC_CALL pyxiYCbCr420ToRGB_8u_P3C3R(const u8* const src[3], const int srcStep[3], u8* dst, int dstStep,

@@ -5,6 +5,7 @@
 #include "frame/row_driver.hpp"
 #include "frame/shared_chroma_forms.hpp"
 #include "layouts/shared_chroma.hpp"
+#include "subsampled/row_pairs.hpp"
 #include "subsampled/tight_images.hpp"
 #include "subsampled/wide_spans.hpp"
 #include "subsampled/yuv_forms.hpp"
@@ -15,14 +16,6 @@ using namespace pyxcc::subsampled;
 
 namespace
 {
-
-/// All whole blocks in one form.
-template <class Source, class Target, class Form>
-PyxStatus inOneForm(RoiSize roi, const Source& source, const Target& target, Form form)
-{
-    eachRowPair(roi, source, target, spans(upTo<wholePairs>, form));
-    return warnIfOff(roi, 2, 2);
-}
 
 /// 4:2:2 to planes: a last odd column has a form of its own.
 template <class Source, class Target> PyxStatus toPlanes422(RoiSize roi, const Source& source, const Target& target)
@@ -44,7 +37,7 @@ PyxStatus PYXCC_CALL pyxiYUV420ToRGB_8u_P3R(const u8* const src[3], const int sr
     if (const PyxStatus failure =
             firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1), elementsNotNull<3>(src), elementsNotNull<3>(dst)))
         return failure;
-    return inOneForm(roi, p3<2>(src, srcStep), p3(dst, dstStep), yuvInvExactD);
+    return wholeBlocks(roi, p3<2>(src, srcStep), p3(dst, dstStep), yuvInvExactD);
 }
 
 PyxStatus PYXCC_CALL pyxiYUV420ToRGB_8u_P3(const u8* const src[3], u8* const dst[3], RoiSize roi)
@@ -52,7 +45,7 @@ PyxStatus PYXCC_CALL pyxiYUV420ToRGB_8u_P3(const u8* const src[3], u8* const dst
     if (const PyxStatus failure =
             firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1), elementsNotNull<3>(src), elementsNotNull<3>(dst)))
         return failure;
-    return inOneForm(roi, p3<2>(src, stepsOf420(roi.width).data()), p3(dst, roi.width), yuvInvExactD);
+    return wholeBlocks(roi, p3<2>(src, stepsOf420(roi.width).data()), p3(dst, roi.width), yuvInvExactD);
 }
 
 PyxStatus PYXCC_CALL pyxiYUV420ToRGB_8u_P3C3R(const u8* const src[3], const int srcStep[3], u8* dst, int dstStep,
@@ -60,14 +53,15 @@ PyxStatus PYXCC_CALL pyxiYUV420ToRGB_8u_P3C3R(const u8* const src[3], const int 
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1), elementsNotNull<3>(src)))
         return failure;
-    return inOneForm(roi, p3<2>(src, srcStep), c3(dst, dstStep), yuvInvHigh4);
+    return wholeBlocks(roi, p3<2>(src, srcStep), c3(dst, dstStep), yuvInvHigh4);
 }
 
 PyxStatus PYXCC_CALL pyxiYUV420ToRGB_8u_P3C3(const u8* const src[3], u8* dst, RoiSize roi)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1), elementsNotNull<3>(src)))
         return failure;
-    return inOneForm(roi, p3<2>(src, stepsOf420(roi.width).data()), c3(dst, 3 * std::ptrdiff_t{roi.width}), yuvInvHigh4);
+    return wholeBlocks(roi, p3<2>(src, stepsOf420(roi.width).data()), c3(dst, 3 * std::ptrdiff_t{roi.width}),
+                       yuvInvHigh4);
 }
 
 PyxStatus PYXCC_CALL pyxiYUV420ToBGR_8u_P3C3R(const u8* const src[3], const int srcStep[3], u8* dst, int dstStep,
@@ -75,7 +69,7 @@ PyxStatus PYXCC_CALL pyxiYUV420ToBGR_8u_P3C3R(const u8* const src[3], const int 
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 2, 2), elementsNotNull<3>(src)))
         return failure;
-    return inOneForm(roi, p3<2>(src, srcStep), reversed(c3(dst, dstStep)), yuvInvHigh4x);
+    return wholeBlocks(roi, p3<2>(src, srcStep), reversed(c3(dst, dstStep)), yuvInvHigh4x);
 }
 
 PyxStatus PYXCC_CALL pyxiYUV420ToRGB_8u_P3AC4R(const u8* const src[3], const int srcStep[3], u8* dst, int dstStep,

@@ -62,4 +62,12 @@ template <class Form> void expectInstancesAgreeOnSums(const Form& form, int pixe
     }
 }
 
+/// A chroma form and how many pixels its sums are of.
+template <class ChromaForm, int Pixels> struct OfPixels {
+    using Form = ChromaForm;
+    static constexpr int pixels = Pixels;
+
+    static void expectInstancesAgreeOnSums() { forms::expectInstancesAgreeOnSums(Form{}, pixels); }
+};
+
 } // namespace forms

@@ -9,6 +9,7 @@ namespace
 {
 
 using namespace pyxcc::subsampled;
+using forms::OfPixels;
 
 template <class Form> class SharedChromaLuma : public testing::Test
 {
@@ -29,12 +30,6 @@ struct LumaNames {
 TYPED_TEST_SUITE(SharedChromaLuma, LumaForms, LumaNames);
 
 TYPED_TEST(SharedChromaLuma, InstancesAgreeOnEveryInput) { forms::expectInstancesAgree(TypeParam{}); }
-
-/// A chroma form and how many pixels its sums are of.
-template <class ChromaForm, int Pixels> struct OfPixels {
-    using Form = ChromaForm;
-    static constexpr int pixels = Pixels;
-};
 
 template <class Case> class SharedChroma : public testing::Test
 {
@@ -60,9 +55,6 @@ struct ChromaNames {
 
 TYPED_TEST_SUITE(SharedChroma, ChromaForms, ChromaNames);
 
-TYPED_TEST(SharedChroma, InstancesAgreeOnSums)
-{
-    forms::expectInstancesAgreeOnSums(typename TypeParam::Form{}, TypeParam::pixels);
-}
+TYPED_TEST(SharedChroma, InstancesAgreeOnSums) { TypeParam::expectInstancesAgreeOnSums(); }
 
 } // namespace

@@ -10,6 +10,7 @@ namespace
 {
 
 using namespace pyxcc::subsampled;
+using forms::OfPixels;
 
 template <class Form> class YuvForwardForm : public testing::Test
 {
@@ -30,12 +31,6 @@ TYPED_TEST_SUITE(YuvForwardForm, ForwardForms, ForwardNames);
 
 TYPED_TEST(YuvForwardForm, InstancesAgreeOnEveryInput) { forms::expectInstancesAgree(TypeParam{}); }
 
-/// A chroma form and how many pixels its sums are of.
-template <class ChromaForm, int Pixels> struct OfPixels {
-    using Form = ChromaForm;
-    static constexpr int pixels = Pixels;
-};
-
 template <class Case> class YuvSharedChroma : public testing::Test
 {
 };
@@ -53,10 +48,7 @@ struct ChromaNames {
 
 TYPED_TEST_SUITE(YuvSharedChroma, ChromaForms, ChromaNames);
 
-TYPED_TEST(YuvSharedChroma, InstancesAgreeOnSums)
-{
-    forms::expectInstancesAgreeOnSums(typename TypeParam::Form{}, TypeParam::pixels);
-}
+TYPED_TEST(YuvSharedChroma, InstancesAgreeOnSums) { TypeParam::expectInstancesAgreeOnSums(); }
 
 template <class Form> class YuvInverseForm : public testing::Test
 {
