@@ -83,17 +83,19 @@ void streamFill(u8 value, u8* dst, std::size_t count)
 
 } // namespace
 
+bool fillsHalfTheCache(std::size_t bytes)
+{
+    const std::size_t cache = largestCache();
+    return cache != 0 && bytes >= cache / 2;
+}
+
 PyxStatus copyPlane8u(const u8* src, int srcStep, u8* dst, int dstStep, int width, int height)
 {
     if (!src || !dst) return pyxErrNullPtr;
     if (width < 1 || height < 1) return pyxErrSize;
 
     const Rows rows(width, height, width == srcStep && width == dstStep);
-    bool stream = false;
-    if (rows.bytes >= line && rows.planeBytes() >= 0x100000) {
-        const std::size_t cache = largestCache();
-        stream = cache != 0 && rows.planeBytes() >= cache / 2;
-    }
+    const bool stream = rows.bytes >= line && rows.planeBytes() >= 0x100000 && fillsHalfTheCache(rows.planeBytes());
     for (int y = 0; y < rows.count; ++y) {
         const u8* from = rowAt(src, srcStep, y);
         u8* to = rowAt(dst, dstStep, y);

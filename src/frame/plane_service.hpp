@@ -3,8 +3,13 @@
 
 #include "pyxcc/types.h"
 
+#include <cstddef>
+
 namespace pyxcc::frame
 {
+
+/// Whether an image of so many bytes fills half of the largest cache: as a target, with a source like it, the whole.
+bool fillsHalfTheCache(std::size_t bytes);
 
 /// Copies a plane of bytes row by row; the gaps between the target's rows keep theirs. A plane that would fill half of
 /// the largest cache goes past it.

@@ -195,7 +195,8 @@ template <class Row> TwoRows(Row, Row) -> TwoRows<Row>;
 enum class First { luma, chroma };
 
 /// A packed row: pixels of two bytes, of which the one of chroma belongs to one component and to the other by turns.
-template <First first, class Byte> struct PackedRow {
+/// Stores that go past the cache take whole blocks of rows that lie at multiples of 32.
+template <First first, class Byte, Stores stores = Stores::cached> struct PackedRow {
     Byte* pixels;
 
     PYXCC_INLINE WithLuma<2, ChromaInPairs> load(std::ptrdiff_t i) const
@@ -229,10 +230,13 @@ private:
     static PYXCC_INLINE void storeHalves(u8* p, wide::U8 luma, wide::U8 chroma)
     {
         const Two<wide::U8> x = first == First::luma ? alternated<1>(luma, chroma) : alternated<1>(chroma, luma);
-        storeSamples(p, x.a);
-        storeSamples(p + 32, x.b);
+        detail::put<stores>(p, x.a.v);
+        detail::put<stores>(p + 32, x.b.v);
     }
 };
+
+template <class Row> inline constexpr bool goesPastCache = false;
+template <First first, class Byte> inline constexpr bool goesPastCache<PackedRow<first, Byte, Stores::streamed>> = true;
 
 // Images.
 
@@ -257,12 +261,12 @@ template <class Byte> struct TwoPlanes {
     PYXCC_INLINE auto chroma(int j) const { return PairsRow<Byte>{rowAt(first[1], step[1], j)}; }
 };
 
-/// Packed rows.
-template <First order, class Byte> struct Packed {
+/// Packed rows, which have their chroma with them.
+template <First order, class Byte, Stores stores = Stores::cached> struct Packed {
     Byte* first;
     std::ptrdiff_t step;
 
-    PYXCC_INLINE auto row(int y) const { return PackedRow<order, Byte>{rowAt(first, step, y)}; }
+    PYXCC_INLINE auto row(int y, int = 0) const { return PackedRow<order, Byte, stores>{rowAt(first, step, y)}; }
 };
 
 } // namespace pyxcc::layouts

@@ -118,7 +118,9 @@ PYXCC_INLINE void takeRow(std::ptrdiff_t samples, const Source& source, const Ta
     std::ptrdiff_t i = 0;
     for (; i <= samples - blockSamples; i += blockSamples) {
         expectBlock<layouts::expectedLoads, Block::sourceSamples>(i, source);
-        expectBlock<layouts::expectedStores, Block::targetSamples>(i, target);
+        if constexpr (!layouts::goesPastCache<Target>) {
+            expectBlock<layouts::expectedStores, Block::targetSamples>(i, target);
+        }
         Block::take(i, source, target);
     }
     if (i < samples) Block::take(samples - blockSamples, source, target);

@@ -5,8 +5,12 @@
 #include "frame/plane_service.hpp"
 #include "frame/row_driver.hpp"
 #include "frame/sample_forms.hpp"
+#include "layouts/avx2/stream.hpp"
 #include "layouts/images.hpp"
 #include "subsampled/index_rules.hpp"
+
+#include <cstdint>
+#include <type_traits>
 
 namespace pyxcc::subsampled
 {
@@ -35,20 +39,32 @@ template <int Columns, class Image> struct LumaAndChromaOf {
     }
 };
 
-template <layouts::First order, class Byte> struct PackedRowsOf {
-    layouts::Packed<order, Byte> image;
+template <class Image> inline constexpr bool isPacked = false;
+template <layouts::First order, class Byte, layouts::Stores stores>
+inline constexpr bool isPacked<layouts::Packed<order, Byte, stores>> = true;
 
-    PYXCC_INLINE auto row(int y, int) const { return image.row(y); }
-};
-
-template <int Columns, class Image> auto whole(const Image& image) { return LumaAndChromaOf<Columns, Image>{image}; }
-template <int Columns, layouts::First order, class Byte> auto whole(const layouts::Packed<order, Byte>& image)
+template <int Columns, class Image> auto whole(const Image& image)
 {
-    return PackedRowsOf<order, Byte>{image};
+    if constexpr (isPacked<Image>) {
+        return image;
+    } else {
+        return LumaAndChromaOf<Columns, Image>{image};
+    }
 }
 
-template <class Image> inline constexpr bool isPacked = false;
-template <layouts::First order, class Byte> inline constexpr bool isPacked<layouts::Packed<order, Byte>> = true;
+/// Takes a source to packed rows past the cache, where that can be done throughout: a large image by whole blocks at
+/// multiples of their registers. Planes, which are several targets at a time, are slower that way.
+template <class Rule, layouts::First order, class EachStep>
+bool streamToPacked(int samples, int steps, const layouts::Packed<order, u8>& target, const EachStep& eachStep)
+{
+    const std::size_t bytes = 2 * static_cast<std::size_t>(samples) * Rule::columns * steps * Rule::rows;
+    const bool aligned =
+        (reinterpret_cast<std::uintptr_t>(target.first) | static_cast<std::size_t>(target.step)) % 32 == 0;
+    if (!aligned || samples % blockSamples != 0 || steps < 1 || !frame::fillsHalfTheCache(bytes)) return false;
+    eachStep(layouts::Packed<order, u8, layouts::Stores::streamed>{target.first, target.step});
+    layouts::fenceStreams();
+    return true;
+}
 
 /// Sizes off the rule's block are rounded down.
 template <class Rule, class Source, class Target>
@@ -59,7 +75,11 @@ PyxStatus repack(RoiSize roi, const Source& source, const Target& target)
         for (int j = 0; j < steps; ++j) Rule::step(j, samples, from, to);
     };
     if constexpr (isPacked<Source> || isPacked<Target>) {
-        eachStep(whole<Rule::sourceColumns>(source), whole<Rule::targetColumns>(target));
+        const auto from = whole<Rule::sourceColumns>(source);
+        if constexpr (isPacked<Target>) {
+            if (streamToPacked<Rule>(samples, steps, target, [&](const auto& to) { eachStep(from, to); })) return pyxOk;
+        }
+        eachStep(from, whole<Rule::targetColumns>(target));
     } else {
         frame::copyPlane8u(source.first[0], static_cast<int>(source.step[0]), target.first[0],
                            static_cast<int>(target.step[0]), samples * Rule::columns, steps * Rule::rows);

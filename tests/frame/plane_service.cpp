@@ -1,6 +1,7 @@
 // The copy and the fill of whole planes at every alignment and on both sides of their limits, against plain loops.
 #include "frame/plane_service.hpp"
 
+#include "cache_size.hpp"
 #include "pyxcc/core.h"
 #include "support/compare.hpp"
 #include "support/fault_report.hpp"
@@ -14,11 +15,12 @@ using namespace support;
 using pyxcc::frame::copyPlane8u;
 using pyxcc::frame::fillPlane8u;
 
+s32 cacheSize = 0;
+
 namespace
 {
 
-s32 cacheSize = 0; ///< what pyxGetMaxCacheSizeB() tells; 0 for not known
-int questions = 0; ///< how often it was asked
+int questions = 0; ///< how often the cache's size was asked for
 
 } // namespace
 
@@ -33,7 +35,6 @@ PyxStatus PYXCC_CALL pyxGetMaxCacheSizeB(s32* size)
 namespace
 {
 
-constexpr s32 tinyCache = 1; ///< so that whatever may go past the cache does
 constexpr int copyLimit = 0x100000;
 constexpr int fillLimit = 0x600000;
 
