@@ -155,7 +155,10 @@ std::string_view nameOf(Element element) { return elements[static_cast<int>(elem
 PlaneShape shapeOf(const Side& side, int plane, RoiSize roi)
 {
     const bool chroma = (plane == 1 || plane == 2) && side.arrangement != Arrangement::interleaved;
-    const int width = chroma ? blocks(roi.width, side.chromaX, side.chromaUp) : roi.width;
+    // Interleaved chroma lies beside luma, whose row goes on to the end of a block that is filled up.
+    const int wholeBlocks = blocks(roi.width, side.chromaX, side.chromaUp) << side.chromaX;
+    const int lumaWidth = side.chromaUp && side.arrangement == Arrangement::interleaved ? wholeBlocks : roi.width;
+    const int width = chroma ? blocks(roi.width, side.chromaX, side.chromaUp) : lumaWidth;
     const int height = chroma ? blocks(roi.height, side.chromaY, side.chromaUp) : roi.height;
     const int samples = chroma && side.arrangement == Arrangement::semiPlanar ? 2 : side.samples;
     const int count = std::max(width, 0) * samples;

@@ -40,6 +40,9 @@ enum class Family {
     ycocg,
     cbycr422,
     toneMap,
+    packedRgb,
+    ycbcrToPacked,
+    ditheredPacked,
 };
 
 struct FamilyInfo {

@@ -49,6 +49,13 @@ constexpr FamilyInfo table[] = {
      "YCbCr forms to it and back."},
     {Family::toneMap, "tone-map", "Tone mapping",
      "Floats of any range to 8 bits, by a scale that comes from the image's largest sample or from its mean."},
+    {Family::packedRgb, "packed-rgb", "Packed RGB",
+     "16-bit pixels of three fields, 555 or 565, to 8-bit RGB, YCbCr and YUV with shared chroma; RGB to 565."},
+    {Family::ycbcrToPacked, "ycbcr-to-packed", "YCbCr to packed RGB",
+     "8-bit YCbCr and YUV, at full resolution or with shared chroma, to 16-bit pixels of three fields, 444, 555 or "
+     "565."},
+    {Family::ditheredPacked, "dithered-packed", "YCbCr to dithered packed RGB",
+     "8-bit YCbCr and YUV to 16-bit pixels of three fields, with ordered dithering."},
 };
 
 } // namespace

@@ -85,8 +85,10 @@ void setSubsampling(Side& side)
 /// A 555, 565 or 444 pixel is one 16-bit sample, whatever its layout token says.
 void setPackedPixel(Side& side)
 {
-    const bool packed = side.model.starts_with("RGB") || side.model.starts_with("BGR");
-    if (packed && side.model.size() > 3 && side.element == Element::u16) side.samples = 1;
+    const bool rgb = side.model.starts_with("RGB") || side.model.starts_with("BGR");
+    if (!rgb || side.model.size() == 3 || side.element != Element::u16) return;
+    side.samples = 1;
+    side.stepUnit = 2;
 }
 
 /// "YCbCr420" for the target of "YCbCr411To420": a bare subsampling keeps the source's model.
@@ -149,6 +151,8 @@ Naming readName(std::string_view name)
         setSubsampling(*side);
         setPackedPixel(*side);
     }
+    // Interleaved bytes are packed at any step.
+    if (naming.source.model.size() == 3) naming.target.stepUnit = 1;
     return naming;
 }
 

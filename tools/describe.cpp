@@ -75,9 +75,11 @@ std::string sampleOrder(const Side& side)
     return joined(names, " ");
 }
 
-std::string divided(const std::string& length, int shift)
+std::string divided(const std::string& length, int shift, bool up)
 {
-    return shift == 0 ? length : length + "/" + std::to_string(1 << shift);
+    if (shift == 0) return length;
+    const std::string whole = up ? "(" + length + "+" + std::to_string((1 << shift) - 1) + ")" : length;
+    return whole + "/" + std::to_string(1 << shift);
 }
 
 std::string stepWords(const Side& side)
@@ -100,7 +102,8 @@ std::string stepWords(const Side& side)
 std::string shapeWords(const Side& side, Range range)
 {
     const std::string full = "width x height";
-    const std::string chroma = divided("width", side.chromaX) + " x " + divided("height", side.chromaY);
+    const std::string chroma =
+        divided("width", side.chromaX, side.chromaUp) + " x " + divided("height", side.chromaY, side.chromaUp);
     std::ostringstream text;
     if (isPacked(side)) {
         text << "one 16-bit pixel of the fields " << sampleOrder(side) << " from the low bits up";
@@ -111,6 +114,7 @@ std::string shapeWords(const Side& side, Range range)
         } else if (side.samples > 1 || catalog::sizeOf(side.element) > 1) {
             text << ", " << side.samples * catalog::sizeOf(side.element) << " bytes a pixel";
         }
+        if (side.chromaUp) text << ", to the end of a last pair";
     } else if (side.arrangement == Arrangement::semiPlanar) {
         const auto names = componentsOf(side);
         text << "planes " << names[0] << " (" << full << ") and " << names[1] << ' ' << names[2] << " pairs (" << chroma

@@ -8,11 +8,13 @@
 #include "pyxcc/bt709.h"
 #include "pyxcc/cbycr422.h"
 #include "pyxcc/color_twist.h"
+#include "pyxcc/dithered_packed.h"
 #include "pyxcc/filter_interlace.h"
 #include "pyxcc/gamma.h"
 #include "pyxcc/gray.h"
 #include "pyxcc/hls.h"
 #include "pyxcc/hsv.h"
+#include "pyxcc/packed_rgb.h"
 #include "pyxcc/repack.h"
 #include "pyxcc/rgb_to_subsampled.h"
 #include "pyxcc/rgb_ycbcr.h"
@@ -23,6 +25,7 @@
 #include "pyxcc/types.h"
 #include "pyxcc/version.h"
 #include "pyxcc/xyz_ycc.h"
+#include "pyxcc/ycbcr_to_packed.h"
 #include "pyxcc/ycocg.h"
 
 #endif

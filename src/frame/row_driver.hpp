@@ -99,4 +99,22 @@ PYXCC_INLINE PyxStatus eachRowPair(RoiSize roi, const Source& source, const Targ
     return pyxOk;
 }
 
+/// The same, but an odd last row is taken as well: as a pair without its second row, and by a plan of its own.
+template <class Source, class Target, class Plan, class LastPlan>
+PYXCC_INLINE PyxStatus eachRowByPairs(RoiSize roi, const Source& source, const Target& target, const Plan& plan,
+                                      const LastPlan& lastPlan)
+{
+    eachRowPair(roi, source, target, plan);
+    convertRows(
+        roi.width, roi.height & 1, [&](int) PYXCC_INLINE_LAMBDA { return source.halfPair(roi.height >> 1); },
+        [&](int) PYXCC_INLINE_LAMBDA { return target.halfPair(roi.height >> 1); }, lastPlan);
+    return pyxOk;
+}
+
+template <class Source, class Target, class Plan>
+PYXCC_INLINE PyxStatus eachRowByPairs(RoiSize roi, const Source& source, const Target& target, const Plan& plan)
+{
+    return eachRowByPairs(roi, source, target, plan, plan);
+}
+
 } // namespace pyxcc::frame

@@ -78,6 +78,8 @@ inline Byte low8(S16 x) { return {static_cast<u8>(x.v)}; }
 
 inline S16 mulRound15(S16 x, int k) { return (x.v * k + 16384) >> 15; }
 inline S16 mulHighS16(S16 x, int k) { return (x.v * k) >> 16; }
+inline U16 lesser(U16 x, U16 y) { return std::min<int>(x.v, y.v); }
+inline U16 mulHighU16(U16 x, U16 y) { return static_cast<int>((u32{x.v} * u32{y.v}) >> 16); }
 inline U16 mulHighU16(U16 x, int k) { return static_cast<int>((static_cast<u32>(x.v) * static_cast<u32>(k)) >> 16); }
 
 /// mulHighS16((x - Zero) << Bits, Weight): what a sample adds in the high-product forms.

@@ -10,15 +10,36 @@
 namespace pyxcc::layouts
 {
 
+/// A packing that is another one in every row says which it is in row `y`.
+template <class Packing> PYXCC_INLINE Packing packingOfRow(const Packing& packing, [[maybe_unused]] int y)
+{
+    if constexpr (requires { packing.ofRow(y); }) {
+        return packing.ofRow(y);
+    } else {
+        return packing;
+    }
+}
+
+template <class Packing> PYXCC_INLINE Reversed<Packing> packingOfRow(const Reversed<Packing>& reversed, int y)
+{
+    return {packingOfRow(reversed.packing, y)};
+}
+
 template <class Packing, class Byte> struct InterleavedImage {
     Byte* first;
     std::ptrdiff_t step;
     Packing packing;
 
-    PYXCC_INLINE auto row(int y) const { return InterleavedRow<Packing, Byte>{rowAt(first, step, y), packing}; }
+    PYXCC_INLINE auto row(int y) const
+    {
+        return InterleavedRow<Packing, Byte>{rowAt(first, step, y), packingOfRow(packing, y)};
+    }
 
     /// Rows 2 j and 2 j + 1.
     PYXCC_INLINE auto rowPair(int j) const { return RowPair{row(2 * j), row(2 * j + 1)}; }
+
+    /// The same pair where it has no second row.
+    PYXCC_INLINE auto halfPair(int j) const { return row(2 * j); }
 };
 
 template <class Samples, class Byte, int Planes> struct PlanarImage {

@@ -179,6 +179,9 @@ template <class Chroma, class Byte> struct SharedChromaImage {
         return SharedChromaRow{RowPair{luma(2 * j), luma(2 * j + 1)}, chroma.row(j)};
     }
 
+    /// The same pair where it has no second row.
+    PYXCC_INLINE auto halfPair(int j) const { return SharedChromaRow{luma(2 * j), chroma.row(j)}; }
+
 private:
     PYXCC_INLINE auto luma(int y) const { return SampleRow<wide::U8, Byte>{rowAt(first, step, y)}; }
 };
@@ -213,6 +216,12 @@ struct LumaFirstAlone : LumaFirst<Order::ofMemory> {
         if (width > 1) return LumaFirst::completeLastPair(end, row, width);
         end[1] = 128;
     }
+};
+
+/// The same as a source whose rows go on to the end of a last pair: there, where it would be if the pair were whole, a
+/// last odd pixel has its second chroma sample. Of the luma in front of it nothing is read.
+struct LumaFirstWholePairs : LumaFirst<Order::ofMemory> {
+    static PYXCC_INLINE void completeLastPair(u8* end, const u8* row, int width) { end[1] = row[2 * width + 1]; }
 };
 
 /// Chroma and luma bytes in turn, chroma first.
@@ -289,6 +298,12 @@ template <class Byte> auto c2LumaFirstAlone(Byte* first, int step)
     return InterleavedImage<LumaFirstAlone, Byte>{first, step, {}};
 }
 
+/// The same as a source whose rows end with a whole pair.
+inline auto c2WholePairs(const u8* first, int step)
+{
+    return InterleavedImage<LumaFirstWholePairs, const u8>{first, step, {}};
+}
+
 /// Packed pairs of pixels: Cb Y0 Cr Y1.
 template <Order order = Order::ofMemory, class Byte> auto c2ChromaFirst(Byte* first, int step)
 {
@@ -302,11 +317,11 @@ template <Order order = Order::ofMemory, class Byte> auto c2ChromaFirstFromBefor
 }
 
 /// The same image with its chroma components exchanged, Cr before Cb.
-template <int Columns, Order order, class Byte>
-auto chromaExchanged(const SharedChromaImage<ChromaPlanes<Columns, Byte, order>, Byte>& image)
+template <int Columns, Order order, Rest rest, class Byte>
+auto chromaExchanged(const SharedChromaImage<ChromaPlanes<Columns, Byte, order, rest>, Byte>& image)
 {
     const auto& [first, step] = image.chroma;
-    return SharedChromaImage<ChromaPlanes<Columns, Byte, order>, Byte>{
+    return SharedChromaImage<ChromaPlanes<Columns, Byte, order, rest>, Byte>{
         image.first, image.step, {{first[1], first[0]}, {step[1], step[0]}}};
 }
 

@@ -98,6 +98,13 @@ struct InLumaFirstAlone : InLumaFirst {
     static auto image(const Pointers& at, const Steps& steps) { return layouts::c2LumaFirstAlone(at[0], steps[0]); }
 };
 
+/// The same in rows that go on to the end of a last pair.
+struct InWholePairs {
+    static std::vector<Shape> planes(int width) { return {{(width + 1) / 2 * 4}}; }
+    static auto image(const Pointers& at, const Steps& steps) { return layouts::c2WholePairs(at[0], steps[0]); }
+    static Pixel pixel(int x, int) { return {{0, 2 * x}, {0, x / 2 * 4 + 1}, {0, x / 2 * 4 + 3}}; }
+};
+
 struct InExchangedLumaFirst : InLumaFirst {
     static auto image(const Pointers& at, const Steps& steps) { return chromaExchanged(InLumaFirst::image(at, steps)); }
     static Pixel pixel(int x, int width)
@@ -163,6 +170,7 @@ protected:
                 return apply(Unchanged{}, count == U8::count ? row.load(x) : row.load(x, count));
             };
             ASSERT_NO_FATAL_FAILURE(expectPixels(load(image.row(0)), 0, x, x + count, width));
+            ASSERT_NO_FATAL_FAILURE(expectPixels(load(image.halfPair(0)), 0, x, x + count, width));
             if constexpr (requires { image.rowPair(0).luma; }) {
                 if (Layout::planes(width)[0].rows < 2) continue;
                 const Two<Three<U8>> rows = load(image.rowPair(0));
@@ -184,13 +192,14 @@ private:
 struct Names {
     template <class Layout> static std::string GetName(int i)
     {
-        return std::array{"P3Halves",    "P3HalvesExchanged", "P3Quarters",           "P2",           "P2Exchanged",
-                          "C2LumaFirst", "C2LumaFirstAlone",  "C2LumaFirstExchanged", "C2ChromaFirst"}[i];
+        return std::array{"P3Halves",      "P3HalvesExchanged", "P3Quarters",       "P2",
+                          "P2Exchanged",   "C2LumaFirst",       "C2LumaFirstAlone", "C2LumaFirstExchanged",
+                          "C2ChromaFirst", "C2WholePairs"}[i];
     }
 };
 
 using Layouts = testing::Types<InHalfPlanes, InExchangedHalfPlanes, InQuarterPlanes, InPairs, InExchangedPairs,
-                               InLumaFirst, InLumaFirstAlone, InExchangedLumaFirst, InChromaFirst>;
+                               InLumaFirst, InLumaFirstAlone, InExchangedLumaFirst, InChromaFirst, InWholePairs>;
 TYPED_TEST_SUITE(SharedChroma, Layouts, Names);
 
 /// Widths from 4, the least that all of the layouts have.

@@ -124,6 +124,16 @@ TEST(Describe, TellsTestsInTheirOrder)
     EXPECT_NE(sheetOf(withAlpha()).find("pyxErrSize (-6)"), std::string::npos);
 }
 
+TEST(Describe, TellsOfPartsOfBlocksAndOfPackedPixels)
+{
+    EXPECT_NE(sheetOf(named("pyxiYCbCr422ToRGB_8u_P3C3R")).find("Cb ((width+1)/2 x height)"), std::string::npos);
+    const std::string sheet = sheetOf(named("pyxiYCbCr422ToBGR565_8u16u_C2C3R"));
+    EXPECT_NE(sheet.find("Y Cb Y Cr, 2 bytes a pixel, to the end of a last pair; 0 to 255; a step\n"),
+              std::string::npos);
+    EXPECT_NE(sheet.find("one 16-bit pixel of the fields B G R from the low bits up; a step, without its low bit\n"),
+              std::string::npos);
+}
+
 TEST(Describe, NamesTheStatusesOfStepsAndParameters)
 {
     catalog::Export entry = named("pyxiRGBToYCbCr_8u_C3R");

@@ -111,7 +111,9 @@ PYXCC_INLINE Byte low8(S16 x) { return {_mm256_and_si256(x.v, _mm256_set1_epi16(
 
 PYXCC_INLINE S16 mulRound15(S16 x, int k) { return S16(_mm256_mulhrs_epi16(x.v, S16(k).v)); }
 PYXCC_INLINE S16 mulHighS16(S16 x, int k) { return S16(_mm256_mulhi_epi16(x.v, S16(k).v)); }
-PYXCC_INLINE U16 mulHighU16(U16 x, int k) { return U16(_mm256_mulhi_epu16(x.v, U16(k).v)); }
+PYXCC_INLINE U16 mulHighU16(U16 x, U16 y) { return U16(_mm256_mulhi_epu16(x.v, y.v)); }
+PYXCC_INLINE U16 mulHighU16(U16 x, int k) { return mulHighU16(x, U16(k)); }
+PYXCC_INLINE U16 lesser(U16 x, U16 y) { return U16(_mm256_min_epu16(x.v, y.v)); }
 
 template <int Shift> PYXCC_INLINE S16 roundedShift(S16 x) { return mulRound15(x, 1 << (15 - Shift)); }
 
