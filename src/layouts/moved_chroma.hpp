@@ -169,14 +169,13 @@ template <int Columns, class Byte, class ChromaRow> struct BesideLumaRow {
     }
 };
 
-/// Luma alone: what comes with it is left.
+/// Luma alone, of two columns a sample: the chroma that comes with it is left.
 template <class Byte> struct LumaRow {
     Byte* luma;
 
-    template <int Columns, class Chroma>
-    PYXCC_INLINE void store(std::ptrdiff_t i, const WithLuma<Columns, Chroma>& pixels) const
+    template <class Chroma> PYXCC_INLINE void store(std::ptrdiff_t i, const WithLuma<2, Chroma>& pixels) const
     {
-        detail::storeLuma(luma + Columns * i, pixels.luma);
+        detail::storeLuma(luma + 2 * i, pixels.luma);
     }
 
     template <class F> PYXCC_INLINE LumaRow mapped(const F& f) const { return {f(luma, 2)}; }

@@ -6,17 +6,6 @@
 using namespace pyxcc::frame;
 using namespace pyxcc::subsampled;
 
-namespace
-{
-
-using SameGrid422 = SameGrid<2, 1>;
-
-constexpr auto least2x2 = atLeast<2, 2>;
-constexpr auto least2x1 = atLeast<2, 1>;
-constexpr auto least4 = atLeast<4, anyHeight>;
-
-} // namespace
-
 // clang-format off
 
 //     name                              source                    rule         target               size

@@ -9,8 +9,8 @@
 //     rowFold     (i >> 1, 2 j + (i & 1))         4:1:1 to 4:2:0
 //     rowUnfold   (2 i + (j & 1), j >> 1)         4:2:0 to 4:1:1
 //
-// A rule takes the columns that it rounds the width down to, and the rows that it goes by; its step j takes the rows
-// from row j times that on. `row(y, j)` of a source or a target is the row of luma y and chroma j.
+// A rule goes by so many rows of luma at a time, and takes so many columns a sample where samples are fewer; sizes are
+// rounded down to them. `row(y, j)` of a source or a target is the row of luma y and chroma j.
 #pragma once
 
 #include "layouts/moved_chroma.hpp"
@@ -129,7 +129,7 @@ PYXCC_INLINE void takeRow(std::ptrdiff_t samples, const Source& source, const Ta
 // The rules.
 
 template <int Columns, int Rows, int SourceColumns, int TargetColumns> struct IndexRule {
-    static constexpr int columns = Columns, rows = Rows; ///< what sizes are rounded down to
+    static constexpr int columns = Columns, rows = Rows;
     static constexpr int sourceColumns = SourceColumns, targetColumns = TargetColumns; ///< that share a sample
 };
 
@@ -171,7 +171,7 @@ template <int WideBlock> struct RowDoubleMisplaced : IndexRule<2, 2, 2, 2> {
 
 private:
     template <class Source, class Target>
-    static void takePiece(int from, int to, const Source& source, const Target& target)
+    static void takePiece(std::ptrdiff_t from, std::ptrdiff_t to, const Source& source, const Target& target)
     {
         const auto behind = [from](auto* row, int bytes) { return row + from * bytes; };
         if (from < to) takeRow<AsItIs>(to - from, source.mapped(behind), target.mapped(behind));

@@ -6,22 +6,6 @@
 using namespace pyxcc::frame;
 using namespace pyxcc::subsampled;
 
-namespace
-{
-
-using SameGrid420 = SameGrid<2, 2>;
-using SameGrid422 = SameGrid<2, 1>;
-using SameGrid411 = SameGrid<4, 1>;
-
-constexpr auto least2x2 = atLeast<2, 2>;
-constexpr auto least2x1 = atLeast<2, 1>;
-constexpr auto least4x2 = atLeast<4, 2>;
-constexpr auto least4x1 = atLeast<4, 1>;
-constexpr auto least2 = atLeast<2, anyHeight>;
-constexpr auto least4 = atLeast<4, anyHeight>;
-
-} // namespace
-
 // clang-format off
 
 //     name                                  source                      rule                    target               size

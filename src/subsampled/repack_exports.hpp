@@ -51,6 +51,17 @@ template <int Width, int Height>
 inline constexpr auto atLeast = [](RoiSize roi) { return frame::sizeAtLeast(roi, Width, Height); };
 inline constexpr int anyHeight = std::numeric_limits<s32>::min();
 
+inline constexpr auto least2x2 = atLeast<2, 2>;
+inline constexpr auto least2x1 = atLeast<2, 1>;
+inline constexpr auto least2 = atLeast<2, anyHeight>;
+inline constexpr auto least4x2 = atLeast<4, 2>;
+inline constexpr auto least4x1 = atLeast<4, 1>;
+inline constexpr auto least4 = atLeast<4, anyHeight>;
+
+using SameGrid420 = SameGrid<2, 2>;
+using SameGrid422 = SameGrid<2, 1>;
+using SameGrid411 = SameGrid<4, 1>;
+
 // How the planes are taken.
 
 struct AsTheyAre {
