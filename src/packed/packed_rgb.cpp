@@ -5,6 +5,7 @@
 #include "frame/checks.hpp"
 #include "frame/row_driver.hpp"
 #include "layouts/shared_chroma.hpp"
+#include "packed/chroma_of_fours.hpp"
 #include "packed/models.hpp"
 #include "subsampled/rgb_to_ycbcr_forms.hpp"
 #include "subsampled/wide_spans.hpp"
@@ -56,7 +57,7 @@ template <class Source, class Target> PyxStatus to420(RoiSize roi, const Source&
 
 template <class Source> PyxStatus to411(RoiSize roi, const Source& source, u8* const dst[3], const int dstStep[3])
 {
-    eachRow(roi, source, p3<4>(dst, dstStep), spans(upTo<wholeFours>, fours(lumaExact, chromaEighth<4>)));
+    eachRow(roi, source, p3<4>(dst, dstStep), spans(upTo<wholeFours>, fours(lumaExact, ChromaOfFours{})));
     return warnIfOff(roi, 4, 1);
 }
 
