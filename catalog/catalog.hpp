@@ -43,6 +43,7 @@ enum class Family {
     packedRgb,
     ycbcrToPacked,
     ditheredPacked,
+    lab,
 };
 
 struct FamilyInfo {

@@ -56,6 +56,7 @@ constexpr FamilyInfo table[] = {
      "565."},
     {Family::ditheredPacked, "dithered-packed", "YCbCr to dithered packed RGB",
      "8-bit YCbCr and YUV to 16-bit pixels of three fields, with ordered dithering."},
+    {Family::lab, "lab", "Lab", "RGB to CIE L*a*b* and back: floats, 8 bits, and 16 bits of Lab with 8 of colour."},
 };
 
 } // namespace

@@ -16,6 +16,7 @@
 #include "pyxcc/hsv.h"
 #include "pyxcc/packed_rgb.h"
 #include "pyxcc/repack.h"
+#include "pyxcc/lab.h"
 #include "pyxcc/rgb_to_subsampled.h"
 #include "pyxcc/rgb_ycbcr.h"
 #include "pyxcc/rgb_yuv.h"

@@ -12,6 +12,7 @@
 #include "lanes/avx2/integers.hpp"
 #include "lanes/avx2/means.hpp"
 #include "lanes/avx2/pixels.hpp"
+#include "lanes/avx2/pairs_of_floats.hpp"
 #include "lanes/avx2/reciprocal.hpp"
 #include "lanes/avx2/samples.hpp"
 #include "lanes/scalar.hpp"

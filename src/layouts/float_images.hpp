@@ -3,6 +3,7 @@
 #pragma once
 
 #include "layouts/avx2/eights.hpp"
+#include "layouts/avx2/eights_of_words.hpp"
 #include "layouts/images.hpp"
 
 namespace pyxcc::layouts
@@ -18,7 +19,21 @@ template <class Byte> struct C3Eights {
     static PYXCC_INLINE void store(u8* p, const Three<wide::S32>& pixels) { storeEightTriples<Byte>(p, pixels); }
 };
 
-/// The same with a fourth byte, which a store puts back as it was.
+/// Three interleaved unsigned words a pixel, eight pixels a block too.
+template <> struct C3Eights<u16> {
+    using Samples = wide::F32;
+    static constexpr int pixelBytes = 6;
+    static constexpr bool readsTarget = false;
+
+    static PYXCC_INLINE Three<wide::F32> load(const u8* p)
+    {
+        const Three<wide::S32> words = loadEightTriplesOfWords(p);
+        return {toF32(words.a), toF32(words.b), toF32(words.c)};
+    }
+    static PYXCC_INLINE void store(u8* p, const Three<wide::S32>& pixels) { storeEightTriplesOfWords(p, pixels); }
+};
+
+/// Three interleaved bytes and a fourth one, which a store puts back as it was.
 template <class Byte> struct AC4Eights {
     using Samples = wide::F32;
     static constexpr int pixelBytes = 4;
@@ -27,6 +42,12 @@ template <class Byte> struct AC4Eights {
     static PYXCC_INLINE Three<wide::F32> load(const u8* p) { return loadEightQuadruples<Byte>(p); }
     static PYXCC_INLINE void store(u8* p, const Three<wide::S32>& pixels) { storeEightQuadruples<Byte>(p, pixels); }
 };
+
+/// Blocks of eight pixels, whatever the samples on the other side.
+template <class Sample> auto c3Eights(Sample* first, std::ptrdiff_t step)
+{
+    return detail::interleaved(first, step, C3Eights<std::remove_const_t<Sample>>{});
+}
 
 template <class Sample> auto c3ForFloats(Sample* first, std::ptrdiff_t step)
 {

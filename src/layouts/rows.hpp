@@ -74,10 +74,13 @@ template <class Packing> struct Reversed {
     Packing packing;
 
     PYXCC_INLINE Three<Samples> load(const u8* p) const { return reverse(packing.load(p)); }
-    PYXCC_INLINE void store(u8* p, const Three<Samples>& pixels) const { packing.store(p, reverse(pixels)); }
+    template <class Lanes> PYXCC_INLINE void store(u8* p, const Three<Lanes>& pixels) const
+    {
+        packing.store(p, reverse(pixels));
+    }
 
 private:
-    static PYXCC_INLINE Three<Samples> reverse(const Three<Samples>& x) { return {x.c, x.b, x.a}; }
+    template <class Lanes> static PYXCC_INLINE Three<Lanes> reverse(const Three<Lanes>& x) { return {x.c, x.b, x.a}; }
 };
 
 /// Registers of samples as they lie, for forms to which all channels are alike. Of pixels of four samples the first
