@@ -44,6 +44,7 @@ enum class Family {
     ycbcrToPacked,
     ditheredPacked,
     lab,
+    luv,
 };
 
 struct FamilyInfo {

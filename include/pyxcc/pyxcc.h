@@ -17,6 +17,7 @@
 #include "pyxcc/packed_rgb.h"
 #include "pyxcc/repack.h"
 #include "pyxcc/lab.h"
+#include "pyxcc/luv.h"
 #include "pyxcc/rgb_to_subsampled.h"
 #include "pyxcc/rgb_ycbcr.h"
 #include "pyxcc/rgb_yuv.h"

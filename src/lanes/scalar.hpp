@@ -157,7 +157,9 @@ inline F32 withoutLowBits(F32 x, int count) { return std::bit_cast<f32>(std::bit
 
 /// Out of range and NaN give the lowest integer.
 inline S32 trunc(F32 x) { return x.v >= -0x1p31f && x.v < 0x1p31f ? static_cast<s32>(x.v) : INT32_MIN; }
-inline S32 nearest(F32 x) { return trunc(std::nearbyint(x.v)); }
+inline S32 trunc(F64 x) { return x.v > -0x1p31 - 1 && x.v < 0x1p31 ? static_cast<s32>(x.v) : INT32_MIN; }
+inline F64 doublesBeside(F32, f64 k) { return k; }
+inline S32 nearest(F32 x) { return trunc(F32(std::nearbyint(x.v))); }
 
 /// Clamps an integer at both ends of a sample's range.
 template <std::integral Sample> Sample saturate(S32 x)

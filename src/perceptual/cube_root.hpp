@@ -12,11 +12,21 @@ template <class F32> struct RootStart {
     F32 y; ///< a root near by
 };
 
-template <class F32> PYXCC_INLINE RootStart<F32> rootStart(const CubeRootTable& table, const F32& v, f32 rowsToOne)
+template <class F32, class Index>
+PYXCC_INLINE RootStart<F32> rootStart(const CubeRootTable& table, const Index& index, const F32& v)
 {
-    const auto row = lookUp(table, trunc(v * rowsToOne));
+    const auto row = lookUp(table, index);
     const F32 y = row.a;
     return {fused(-(y * y), y, v) * row.b, y};
+}
+
+/// Each operation by itself.
+template <class F32, class Index>
+PYXCC_INLINE RootStart<F32> plainRootStart(const CubeRootTable& table, const Index& index, const F32& v)
+{
+    const auto row = lookUp(table, index);
+    const F32 y = row.a;
+    return {(v - (y * y) * y) * row.b, y};
 }
 
 /// The magnitudes of the first coefficients of the binomial series; their signs alternate.
@@ -40,6 +50,28 @@ template <class F32> PYXCC_INLINE F32 rootByEightTerms(const RootStart<F32>& sta
     const F32 u = fused(F32(c1), t, F32(c3) * t3);
     const F32 w = fused(F32(c2), t2, F32(c4) * t4);
     return ((p - q) + (u - w)) * start.y;
+}
+
+/// Terms in ascending order, each operation by itself.
+template <int Terms, class F32> PYXCC_INLINE F32 rootByPlainTerms(const RootStart<F32>& start, const LastTerms& last)
+{
+    using namespace series;
+    const f32 coefficients[] = {c1, -c2, c3, -c4, c5, -c6, last.c7, -last.c8};
+    F32 sum = 1.0f, power = start.t;
+    for (int i = 0; i < Terms; ++i) {
+        sum = sum + power * coefficients[i];
+        power = start.t * power;
+    }
+    return sum * start.y;
+}
+
+template <class F32> PYXCC_INLINE F32 rootBySixTerms(const RootStart<F32>& start)
+{
+    using namespace series;
+    const F32 t = start.t, t2 = t * t, t3 = t * t2, t4 = t * t3, t5 = t * t4, t6 = t * t5;
+    const F32 odd = fused(F32(c1), t, fused(F32(c3), t3, F32(c5) * t5));
+    const F32 even = fused(F32(c2), t2, fused(F32(c4), t4, fused(F32(c6), t6, F32(-1.0f))));
+    return (odd - even) * start.y;
 }
 
 template <class F32> PYXCC_INLINE F32 rootByFourTerms(const RootStart<F32>& start)

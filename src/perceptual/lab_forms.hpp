@@ -74,7 +74,7 @@ template <class Depth, class Sums> struct RgbToLab : frame::OnFloats {
 private:
     template <class F32> static PYXCC_INLINE F32 root(const F32& v)
     {
-        return Depth::root(rootStart(labCubeRootTable, v, labRowsToOne));
+        return Depth::root(rootStart(labCubeRootTable, trunc(v * labRowsToOne), v));
     }
     template <class F32> static PYXCC_INLINE F32 rootOrLine(const F32& v, const F32& root)
     {

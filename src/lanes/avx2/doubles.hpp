@@ -16,6 +16,25 @@ PYXCC_INLINE F32 toF32(const Two<F64>& x)
     return F32(_mm256_set_m128(_mm256_cvtpd_ps(x.b.v), _mm256_cvtpd_ps(x.a.v)));
 }
 
+/// To integers towards zero; out of range and NaN give the lowest integer.
+PYXCC_INLINE S32 trunc(const Two<F64>& x)
+{
+    return S32(_mm256_set_m128i(_mm256_cvttpd_epi32(x.b.v), _mm256_cvttpd_epi32(x.a.v)));
+}
+
+/// A sum of products in doubles, lane by lane.
+PYXCC_INLINE Two<F64> fused(const Two<F64>& x, const Two<F64>& y, const Two<F64>& z)
+{
+    return {fused(x.a, y.a, z.a), fused(x.b, y.b, z.b)};
+}
+PYXCC_INLINE Two<F64> operator-(const Two<F64>& x) { return {-x.a, -x.b}; }
+PYXCC_INLINE Two<F64> operator+(const Two<F64>& x, const Two<F64>& y) { return {x.a + y.a, x.b + y.b}; }
+PYXCC_INLINE Two<F64> operator-(const Two<F64>& x, const Two<F64>& y) { return {x.a - y.a, x.b - y.b}; }
+PYXCC_INLINE Two<F64> operator*(const Two<F64>& x, const Two<F64>& y) { return {x.a * y.a, x.b * y.b}; }
+
+/// The same double in all lanes of as many as there are floats.
+PYXCC_INLINE Two<F64> doublesBeside(F32, f64 k) { return {F64(k), F64(k)}; }
+
 PYXCC_INLINE F64 sqrt(F64 x) { return F64(_mm256_sqrt_pd(x.v)); }
 
 /// x > y ? x : y, so that a NaN on either side gives y.

@@ -1,0 +1,151 @@
+// RGB to CIE L*u*v*. The conversions are kin, not copies: they differ in the terms of the cube root, in the reciprocal,
+// in what is tested for black, and in how results become integers.
+#pragma once
+
+#include "frame/float_forms.hpp"
+#include "perceptual/cube_root.hpp"
+#include "perceptual/xyz_of_rgb.hpp"
+
+namespace pyxcc::perceptual
+{
+
+inline constexpr f32 luvLimit = 0.008856f;           ///< L is a line below it
+inline constexpr f32 un = 0.197839f, vn = 0.468342f; ///< chroma of white
+
+/// What floats have of the series.
+inline constexpr LastTerms luvLastTerms = {0.01900117f, 0.015834307f};
+
+/// x is near 1 / v, and this is nearer.
+template <class F32> PYXCC_INLINE F32 nearer(const F32& x, const F32& v)
+{
+    return fused(-x, fused(x, v, F32(-1.0f)), x);
+}
+
+template <class F32> PYXCC_INLINE F32 plainlyNearer(const F32& x, const F32& v) { return (x + x) - ((v * x) * x); }
+
+/// u and v over 13 L.
+template <class F32> struct LuvChroma {
+    F32 u, v;
+};
+
+template <class F32> PYXCC_INLINE F32 luvDenominator(const F32& X, const F32& Y, const F32& Z)
+{
+    return fused(Y, F32(15.0f), fused(F32(3.0f), Z, X));
+}
+
+template <class F32> PYXCC_INLINE LuvChroma<F32> luvChroma(const F32& X, const F32& Y, const F32& denominator)
+{
+    const F32 e = nearer(rcp(denominator), denominator);
+    return {fused(e, X * 4.0f, F32(-un)), fused(Y * 9.0f, e, F32(-vn))};
+}
+
+/// In blocks: black has a denominator of 3.
+template <class F32> PYXCC_INLINE LuvChroma<F32> luvChromaInBlocks(const F32& X, const F32& Y, const F32& Z)
+{
+    const F32 D = luvDenominator(X, Y, Z);
+    return luvChroma(X, Y, whereEqual(D, F32(0.0f), D + 3.0f, D));
+}
+
+/// Behind them: black is where Z is 0.
+template <class F32>
+PYXCC_INLINE LuvChroma<F32> luvChromaBehindBlocks(const F32& X, const F32& Y, const F32& Z, const F32& D)
+{
+    const F32 w = plainlyNearer(rcp(D), D), zero = 0.0f;
+    const F32 up = whereEqual(Z, zero, zero, (X * 4.0f) * w), vp = whereEqual(Z, zero, zero, (Y * 9.0f) * w);
+    return {up - un, vp - vn};
+}
+
+/// Floats; the table has RowsToOne rows up to 1, in thousandths of a row less than 128.
+template <f32 RowsToOne> struct RgbToLuvOfFloats : frame::OnFloats {
+    template <class F32> PYXCC_INLINE Three<F32> operator()(const F32& R, const F32& G, const F32& B) const
+    {
+        const auto [X, Y, Z] = multiplied<FusedSums>(xyzOfRgb, R, G, B);
+        const F32 root = rootByEightTerms(rootStart(luvCubeRootTable, trunc(Y * RowsToOne), Y), luvLastTerms);
+        const F32 L = whereAtMost(Y, F32(luvLimit), Y * 903.3f, fused(F32(116.0f), root, F32(-16.0f)));
+        const LuvChroma<F32> chroma = luvChromaInBlocks(X, Y, Z);
+        const F32 scale = L * 13.0f;
+        return {L, chroma.u * scale, scale * chroma.v};
+    }
+};
+
+struct RgbToLuvOfFloatsTail : frame::OnFloats {
+    template <class F32> PYXCC_INLINE Three<F32> operator()(const F32& R, const F32& G, const F32& B) const
+    {
+        const auto [X, Y, Z] = multiplied<PlainSums>(xyzOfRgb, R, G, B);
+        const F32 root = rootByPlainTerms<8>(plainRootStart(luvCubeRootTable, trunc(Y * 128.0f), Y), luvLastTerms);
+        const F32 L = whereAtMost(Y, F32(luvLimit), Y * 903.3f, root * 116.0f - 16.0f);
+        const F32 D = fused(Z, F32(3.0f), fused(Y, F32(15.0f), X));
+        const LuvChroma<F32> chroma = luvChromaBehindBlocks(X, Y, Z, D);
+        const F32 scale = L * 13.0f;
+        return {L, chroma.u * scale, chroma.v * scale};
+    }
+};
+
+struct RgbToLuvOfBytes : frame::OnFloats {
+    template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
+    {
+        const f32 unit = 0.003921569f;
+        const auto [X, Y, Z] = multiplied<FusedSums>(xyzOfRgb, R * unit, G * unit, B * unit);
+        const F32 root = rootByFourTerms(rootStart(labCubeRootTable, trunc(Y * 127.998046875f), Y));
+        const F32 L = whereAtMost(Y, F32(luvLimit), Y * 903.3f, fused(F32(116.0f), root, F32(-16.0f)));
+        const F32 D = luvDenominator(X, Y, Z);
+        const LuvChroma<F32> chroma = luvChroma(X, Y, whereAtMost(D, F32(0.0f), D + 3.0f, D));
+        const F32 scale = L * 13.0f;
+        return Three{nearest(L * 2.55f), nearest(fused(chroma.u, scale, F32(134.0f)) * 0.720339f),
+                     nearest(fused(scale, chroma.v, F32(140.0f)) * 0.9732825f)};
+    }
+};
+
+// Words stay at their scale up to the cube root, which only L needs.
+
+inline constexpr f32 wordUnit = 1.5259022e-5f, luvLimitOfWords = 580.378f;
+
+template <class F32> PYXCC_INLINE Three<F32> scaledToWords(const F32& L, const F32& u, const F32& v)
+{
+    return {L * 655.35f, (u + 134.0f) * 185.12712f, (v + 140.0f) * 250.13359f};
+}
+
+struct RgbToLuvOfWords : frame::OnFloats {
+    template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
+    {
+        const auto [X, Y, Z] = multiplied<FusedSums>(xyzOfRgb, R, G, B);
+        const F32 y = Y * wordUnit;
+        const F32 root = rootBySixTerms(rootStart(luvCubeRootTable, trunc(Y) >> 9, y));
+        const F32 L = whereAtMost(Y, F32(luvLimitOfWords), y * 903.3f, root * 116.0f - 16.0f);
+        const LuvChroma<F32> chroma = luvChromaInBlocks(X, Y, Z);
+        const F32 scale = L * 13.0f;
+        const auto [l, u, v] = scaledToWords(L, chroma.u * scale, scale * chroma.v);
+        return Three{nearest(l), nearest(u), nearest(v)};
+    }
+};
+
+struct NearestOfLuv {
+    template <class F32> static PYXCC_INLINE auto stored(const Three<F32>& x)
+    {
+        return Three{nearest(x.a), nearest(x.b), nearest(x.c)};
+    }
+};
+
+/// Chroma to the nearest, halves up; L down.
+struct TruncOfLuv {
+    template <class F32> static PYXCC_INLINE auto stored(const Three<F32>& x)
+    {
+        return Three{trunc(x.a), trunc(x.b + 0.5f), trunc(x.c + 0.5f)};
+    }
+};
+
+template <class Rounding> struct RgbToLuvOfWordsTail : frame::OnFloats {
+    template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
+    {
+        const auto [X, Y, Z] = multiplied<PlainSums>(xyzOfRgb, R, G, B);
+        const F32 y = Y * wordUnit;
+        const F32 root = rootByPlainTerms<6>(plainRootStart(luvCubeRootTable, trunc(Y) >> 9, y), {});
+        const F32 L = whereAtMost(Y, F32(luvLimitOfWords), y * 903.3f, root * 116.0f - 16.0f);
+        const F32 D = (X + Y * 15.0f) + Z * 3.0f;
+        const LuvChroma<F32> chroma = luvChromaBehindBlocks(X, Y, Z, D);
+        const F32 scale = L * 13.0f;
+        return Rounding::stored(scaledToWords(L, chroma.u * scale, chroma.v * scale));
+    }
+};
+
+} // namespace pyxcc::perceptual
