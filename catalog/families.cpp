@@ -57,8 +57,7 @@ constexpr FamilyInfo table[] = {
     {Family::ditheredPacked, "dithered-packed", "YCbCr to dithered packed RGB",
      "8-bit YCbCr and YUV to 16-bit pixels of three fields, with ordered dithering."},
     {Family::lab, "lab", "Lab", "RGB to CIE L*a*b* and back: floats, 8 bits, and 16 bits of Lab with 8 of colour."},
-    {Family::luv, "luv", "LUV",
-     "RGB to CIE L*u*v* and back in 8 bits, 16 bits with and without a sign, and floats."},
+    {Family::luv, "luv", "LUV", "RGB to CIE L*u*v* and back in 8 bits, 16 bits with and without a sign, and floats."},
 };
 
 } // namespace

@@ -13,9 +13,8 @@ using namespace pyxcc::perceptual;
 namespace
 {
 
-/// The look-up counts 128 rows up to 1 in pixels of four samples, and a little less in those of three.
-auto toLuvOfFloats() { return wideThenTail<8>(RgbToLuvOfFloats<127.998046875f>{}, RgbToLuvOfFloatsTail{}); }
-auto toLuvOfFloatsAC4() { return wideThenTail<4>(RgbToLuvOfFloats<128.0f>{}, RgbToLuvOfFloatsTail{}); }
+auto toLuvOfFloats() { return wideThenTail<8>(RgbToLuvOfFloats(127.998046875f), RgbToLuvOfFloatsTail{}); }
+auto toLuvOfFloatsAC4() { return wideThenTail<4>(RgbToLuvOfFloats(128.0f), RgbToLuvOfFloatsTail{}); }
 auto toRgbOfFloats() { return wideThenTail<8>(LuvToRgbOfFloats{}, LuvToRgbOfFloatsTail{}); }
 auto toRgbOfBytes() { return wideThenTail<8>(LuvToRgbOfBytes{}, LuvToRgbTail<255>{}); }
 

@@ -55,12 +55,16 @@ PYXCC_INLINE LuvChroma<F32> luvChromaBehindBlocks(const F32& X, const F32& Y, co
     return {up - un, vp - vn};
 }
 
-/// Floats; the table has RowsToOne rows up to 1, in thousandths of a row less than 128.
-template <f32 RowsToOne> struct RgbToLuvOfFloats : frame::OnFloats {
+/// Floats. The rows of the table up to 1 are counted as 128, or as a little less.
+struct RgbToLuvOfFloats : frame::OnFloats {
+    f32 rowsToOne;
+
+    constexpr explicit RgbToLuvOfFloats(f32 rows) : rowsToOne(rows) {}
+
     template <class F32> PYXCC_INLINE Three<F32> operator()(const F32& R, const F32& G, const F32& B) const
     {
         const auto [X, Y, Z] = multiplied<FusedSums>(xyzOfRgb, R, G, B);
-        const F32 root = rootByEightTerms(rootStart(luvCubeRootTable, trunc(Y * RowsToOne), Y), luvLastTerms);
+        const F32 root = rootByEightTerms(rootStart(luvCubeRootTable, trunc(Y * rowsToOne), Y), luvLastTerms);
         const F32 L = whereAtMost(Y, F32(luvLimit), Y * 903.3f, fused(F32(116.0f), root, F32(-16.0f)));
         const LuvChroma<F32> chroma = luvChromaInBlocks(X, Y, Z);
         const F32 scale = L * 13.0f;
