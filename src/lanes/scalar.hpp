@@ -224,11 +224,12 @@ inline PixelWords asPixelWords(const Three<S32>& upper) { return {upper.a, {(upp
 
 // Samples compared, chosen and looked up. Masks have all bits set, or none.
 
-inline U8 operator|(U8 x, U8 y) { return x.v | y.v; }
-inline U8 operator^(U8 x, U8 y) { return x.v ^ y.v; }
+template <class T> Lane<T> operator|(Lane<T> x, Lane<T> y) { return x.v | y.v; }
+template <class T> Lane<T> operator^(Lane<T> x, Lane<T> y) { return x.v ^ y.v; }
 inline U8 lesser(U8 x, U8 y) { return std::min(x.v, y.v); }
-inline U8 greater(U8 x, U8 y) { return std::max(x.v, y.v); }
-inline U8 distance(U8 x, U8 y) { return x.v > y.v ? x - y : y - x; }
+template <class T> Lane<T> greater(Lane<T> x, Lane<T> y) { return std::max(x.v, y.v); }
+template <class T> Lane<T> distance(Lane<T> x, Lane<T> y) { return x.v > y.v ? x - y : y - x; }
+inline U16 avgUp(U16 x, U16 y) { return (x.v + y.v + 1) >> 1; }
 inline U8 mulHighU16(U8 x, int k) { return (x.v * k) >> 16; }
 
 template <class T> Lane<T> equal(Lane<T> x, Lane<T> y) { return x.v == y.v ? -1 : 0; }
@@ -244,7 +245,8 @@ inline F32 whereOdd(S32 x, F32 yes, F32 no) { return x.v % 2 != 0 ? yes : no; }
 // In lanes of 32 bits, of which a register of samples makes several, and one sample makes one.
 
 template <class T> Several<S32, 1> toS32(Lane<T> x) { return several(S32(x.v)); }
-inline Several<S32, 1> differenceIn65536ths(U8 x, U8 y) { return several(S32((x.v - y.v) * 65536)); }
+inline Several<S32, 1> scaledDifference(U8 x, U8 y) { return several(S32((x.v - y.v) * 65536)); }
+inline Several<S32, 1> scaledDifference(U16 x, U16 y) { return several(S32(x.v - y.v)); }
 template <class Samples> Samples saturate(const Several<S32, 1>& x)
 {
     return saturate<decltype(Samples::v)>(x.part[0]);

@@ -5,7 +5,7 @@
 #include "layouts/images.hpp"
 #include "perceptual/hls_forms.hpp"
 #include "perceptual/hls_to_rgb_blocks.hpp"
-#include "perceptual/rgb_to_hls_bytes.hpp"
+#include "perceptual/rgb_to_hls_blocks.hpp"
 #include "pyxcc/hls.h"
 
 using namespace pyxcc::frame;
@@ -15,9 +15,9 @@ using namespace pyxcc::perceptual;
 namespace
 {
 
-constexpr auto bgrToHls = wideThenTail<4>(BgrToHlsOfBytes{}, BgrToHlsTail{});
+constexpr auto bgrToHls = wideThenTail<4>(BgrToHls{}, BgrToHlsTail{});
 constexpr auto hlsToBgr = wideThenTail<4>(HlsToBgr{}, HlsToBgrTail{});
-constexpr auto bgrToHlsWithAlpha = wideThenTail<4>(withFourth(BgrToHlsOfBytes{}), withFourth(BgrToHlsTail{}));
+constexpr auto bgrToHlsWithAlpha = wideThenTail<4>(withFourth(BgrToHls{}), withFourth(BgrToHlsTail{}));
 constexpr auto hlsToBgrWithAlpha = wideThenTail<4>(withFourth(HlsToBgr{}), withFourth(HlsToBgrTail{}));
 
 } // namespace

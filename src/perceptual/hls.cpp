@@ -4,20 +4,20 @@
 #include "perceptual/hls_float_forms.hpp"
 #include "perceptual/hls_to_rgb_blocks.hpp"
 #include "perceptual/hue_images.hpp"
-#include "perceptual/rgb_to_hls_bytes.hpp"
+#include "perceptual/rgb_to_hls_blocks.hpp"
 
 using namespace pyxcc::frame;
 using namespace pyxcc::perceptual;
 
 PyxStatus PYXCC_CALL pyxiRGBToHLS_8u_C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
-    return eachOfC3(src, srcStep, dst, dstStep, roi, wideThenTail<8>(RgbToHlsOfBytes{}, RgbToHlsTail<u8, Truncated>{}));
+    return eachOfC3(src, srcStep, dst, dstStep, roi, wideThenTail<8>(RgbToHls<u8>{}, RgbToHlsTail<u8, Truncated>{}));
 }
 
 /// The only tail here that rounds to nearest.
 PyxStatus PYXCC_CALL pyxiRGBToHLS_8u_AC4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
-    return eachOfAC4(src, srcStep, dst, dstStep, roi, wideThenTail<4>(RgbToHlsOfBytes{}, RgbToHlsTail<u8, Nearest>{}));
+    return eachOfAC4(src, srcStep, dst, dstStep, roi, wideThenTail<4>(RgbToHls<u8>{}, RgbToHlsTail<u8, Nearest>{}));
 }
 
 PyxStatus PYXCC_CALL pyxiRGBToHLS_16u_C3R(const u16* src, int srcStep, u16* dst, int dstStep, RoiSize roi)

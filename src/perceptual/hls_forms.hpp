@@ -37,36 +37,12 @@ template <class Sample, class F32> PYXCC_INLINE F32 saturationUnit(const F32& su
     return greater(lesser(sum, F32(2 * HueScale<Sample>::full) - sum), F32(1));
 }
 
-/// The reciprocal in the vector forms: of bytes as it comes, of words after a step of refinement.
-template <class Sample, class F32> PYXCC_INLINE F32 reciprocal(const F32& v)
-{
-    const F32 x = rcp(v);
-    if constexpr (sizeof(Sample) == 1) return x;
-    return fused(-x, fused(x, v, F32(-1)), x);
-}
-
 /// The reciprocal in the tails, refined without fused operations.
 template <class F32> PYXCC_INLINE F32 refined(const F32& v)
 {
     const F32 x = rcp(v);
     return (x + x) - ((v * x) * x);
 }
-
-/// RGB to HLS, whole blocks. Grays need no case of their own: their differences are 0, and whatever those are
-/// multiplied by is finite.
-template <class Sample> struct RgbToHls : frame::OnFloats {
-    template <class F32> PYXCC_INLINE auto operator()(const F32& r, const F32& g, const F32& b) const
-    {
-        using Scale = HueScale<Sample>;
-        const Extremes<F32> of(r, g, b);
-        const F32 d = of.M - of.m, s = of.M + of.m, l = s * F32(0.5f);
-        const F32 sv = d * reciprocal<Sample>(saturationUnit<Sample>(s));
-        const F32 k = reciprocal<Sample>(greater(d, F32(1))) * F32(60);
-        const Third<F32> third(of.M, r, g, b);
-        const F32 h = notBelow0(fused(third.difference, k, third.offset));
-        return Three{nearest(h * F32(Scale::hueScale)), nearest(l), nearest(sv * F32(Scale::full))};
-    }
-};
 
 /// RGB to HLS, what is left of a row.
 template <class Sample, class Conversion> struct RgbToHlsTail : frame::OnFloats {

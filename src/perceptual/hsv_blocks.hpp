@@ -27,11 +27,11 @@ struct RgbToHsv : frame::OnChannels {
             using F32 = std::remove_cv_t<decltype(spread)>;
             const F32 e = rcp(spread);
             const F32 o = toF32(sextants) - e * toF32(fromG);
-            const F32 c = fused(toF32(difference), e * F32(0x1p-16f), o), t = c * F32(bytesASextant);
+            const F32 c = fused(toF32(difference), e * F32(HueScale<u8>::difference), o), t = c * F32(bytesASextant);
             const F32 h = whereLess(t, F32(0), fused(F32(bytesASextant), c, F32(255)), t);
             return Two{nearest(h), nearest((rcp(toF32(greatest)) * spread) * F32(255))};
         };
-        const auto result = each(core, differenceIn65536ths(plus, minus), toS32(taken), toS32(offset),
+        const auto result = each(core, scaledDifference(plus, minus), toS32(taken), toS32(offset),
                                  toS32(greater(d, U8(1))), toS32(greater(M, U8(1))));
         return {exceptWhere(isGray, saturate<U8>(firstOf(result))), exceptWhere(isGray, saturate<U8>(secondOf(result))),
                 M};

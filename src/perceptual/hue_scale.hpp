@@ -19,6 +19,7 @@ template <class Sample> struct HueScale;
 
 template <> struct HueScale<u8> {
     static constexpr f32 full = 255;
+    static constexpr f32 difference = 0x1p-16f;         ///< what scaledDifference() comes by
     static constexpr f32 hueScale = ofBits(0x3f355555); ///< samples a degree
     static constexpr f32 hk = ofBits(0x3fb4b4b5);       ///< degrees a sample
     static constexpr f32 ck = ofBits(0x3cc0c0c2);       ///< hk times a sixtieth: sextants a sample
@@ -27,6 +28,7 @@ template <> struct HueScale<u8> {
 
 template <> struct HueScale<u16> {
     static constexpr f32 full = 65535;
+    static constexpr f32 difference = 1;
     static constexpr f32 hueScale = ofBits(0x43360aab);
     static constexpr f32 hk = ofBits(0x3bb400b4);
     static constexpr f32 ck = ofBits(0x38c000c1);

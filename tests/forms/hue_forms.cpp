@@ -5,7 +5,7 @@
 #include "perceptual/hls_float_forms.hpp"
 #include "perceptual/hls_to_rgb_blocks.hpp"
 #include "perceptual/hsv_blocks.hpp"
-#include "perceptual/rgb_to_hls_bytes.hpp"
+#include "perceptual/rgb_to_hls_blocks.hpp"
 
 #include <bit>
 #include <random>
@@ -20,9 +20,9 @@ template <class Form> class HueFormOfBytes : public testing::Test
 {
 };
 
-using FormsOfBytes = testing::Types<RgbToHlsOfBytes, RgbToHlsTail<u8, Truncated>, RgbToHlsTail<u8, Nearest>,
-                                    BgrToHlsOfBytes, BgrToHlsTail, HlsToRgb<u8>, HlsToRgbTailOfBytes, HlsToBgr,
-                                    HlsToBgrTail, RgbToHsv, RgbToHsvTail, HsvToRgb<u8>, HsvToRgbTail<u8>>;
+using FormsOfBytes = testing::Types<RgbToHls<u8>, RgbToHlsTail<u8, Truncated>, RgbToHlsTail<u8, Nearest>, BgrToHls,
+                                    BgrToHlsTail, HlsToRgb<u8>, HlsToRgbTailOfBytes, HlsToBgr, HlsToBgrTail, RgbToHsv,
+                                    RgbToHsvTail, HsvToRgb<u8>, HsvToRgbTail<u8>>;
 
 struct NamesOfBytes {
     template <class Form> static std::string GetName(int i)

@@ -34,6 +34,16 @@ PYXCC_INLINE U8 where(U8 mask, U8 yes, U8 no) { return U8(_mm256_blendv_epi8(no.
 PYXCC_INLINE U8 exceptWhere(U8 mask, U8 x) { return U8(_mm256_andnot_si256(mask.v, x.v)); }
 
 PYXCC_INLINE U16 operator&(U16 x, U16 y) { return U16(_mm256_and_si256(x.v, y.v)); }
+PYXCC_INLINE U16 operator|(U16 x, U16 y) { return U16(_mm256_or_si256(x.v, y.v)); }
+PYXCC_INLINE U16 operator^(U16 x, U16 y) { return U16(_mm256_xor_si256(x.v, y.v)); }
+
+PYXCC_INLINE U16 greater(U16 x, U16 y) { return U16(_mm256_max_epu16(x.v, y.v)); }
+PYXCC_INLINE U16 distance(U16 x, U16 y)
+{
+    return U16(_mm256_or_si256(_mm256_subs_epu16(x.v, y.v), _mm256_subs_epu16(y.v, x.v)));
+}
+PYXCC_INLINE U16 avgUp(U16 x, U16 y) { return U16(_mm256_avg_epu16(x.v, y.v)); }
+
 PYXCC_INLINE U16 equal(U16 x, U16 y) { return U16(_mm256_cmpeq_epi16(x.v, y.v)); }
 PYXCC_INLINE U16 where(U16 mask, U16 yes, U16 no) { return U16(_mm256_blendv_epi8(no.v, yes.v, mask.v)); }
 PYXCC_INLINE U16 exceptWhere(U16 mask, U16 x) { return U16(_mm256_andnot_si256(mask.v, x.v)); }
@@ -78,14 +88,16 @@ PYXCC_INLINE Several<S32, 2> toS32(U16 x)
     return several(S32(_mm256_unpacklo_epi16(x.v, zero)), S32(_mm256_unpackhi_epi16(x.v, zero)));
 }
 
-/// (x - y) << 16.
-PYXCC_INLINE Several<S32, 4> differenceIn65536ths(U8 x, U8 y)
+/// (x - y) << 16 of bytes, which takes no extending of a sign, and x - y of words.
+PYXCC_INLINE Several<S32, 4> scaledDifference(U8 x, U8 y)
 {
     const __m256i zero = _mm256_setzero_si256();
     const Two<S16> words = detail::weighted<1, -1>(x, y);
     return several(S32(_mm256_unpacklo_epi16(zero, words.a.v)), S32(_mm256_unpackhi_epi16(zero, words.a.v)),
                    S32(_mm256_unpacklo_epi16(zero, words.b.v)), S32(_mm256_unpackhi_epi16(zero, words.b.v)));
 }
+
+PYXCC_INLINE Several<S32, 2> scaledDifference(U16 x, U16 y) { return toS32(x) - toS32(y); }
 
 template <class Samples, int N> PYXCC_INLINE Samples saturate(const Several<S32, N>& x)
 {
