@@ -11,11 +11,16 @@
 namespace pyxcc::subsampled
 {
 
-/// In 32768ths of a step; 16.5 steps are added.
-struct LumaExact15 : frame::OnWords {
-    template <class Word> PYXCC_INLINE auto operator()(const Word& R, const Word& G, const Word& B) const
+/// (8422 R + 16515 G + 3212 B + 0x84000) >> 15 by bytes: the weights are multiples of 256, 33, 65 and 13 times, less a
+/// rest of 26, 125 and 116. The rest is taken off in 256ths, rounded up, as half of it in 128ths; the half of the odd
+/// part of it, G, is made beforehand and has the rounding in it.
+struct LumaExact15 {
+    template <class Sample> PYXCC_INLINE auto operator()(const Sample& R, const Sample& G, const Sample& B) const
     {
-        return sat8(exactSum<15, 0x84000, 8422, 16515, 3212>(R, G, B));
+        const Sample halfOfG = avgUp(G, Sample(254));
+        const auto whole = weightedPair<33, 65>(R, G) + weightedPair<13, 0>(B, halfOfG);
+        const auto rest = weightedPair<13, 62>(R, G) + weightedPair<58, 1>(B, halfOfG);
+        return asBytes((whole - (rest >> 7) + 2112) >> 7);
     }
 };
 
@@ -58,7 +63,7 @@ PYXCC_INLINE auto apply(FilteredPairs<Samples>, const layouts::AfterPixel<Three<
         return Taps<wide::S16>{layouts::tapSums(x, Samples::of(row.before[channel])), layouts::lowBytes(x)};
     };
     return layouts::ChromaOfSums<2, wide::U8>{
-        apply(LumaExact15{}, pixels),
+        LumaExact15{}(pixels.a, pixels.b, pixels.c),
         layouts::narrowPairs(ChromaOfTaps{}(taps(pixels.a, 0), taps(pixels.b, 1), taps(pixels.c, 2)))};
 }
 
