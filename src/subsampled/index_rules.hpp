@@ -82,7 +82,7 @@ struct ByTurnsToTwoRows {
 template <class Block, class Source, class Target>
 void takePart(int samples, const Source& source, const Target& target)
 {
-    constexpr int mostRows = 4, mostBytes = 4; // two rows of two planes; a packed sample
+    constexpr int mostRows = 8, mostBytes = 4; // four rows of two planes; a packed sample
     using Buffer = u8[2 * blockSamples * mostBytes];
     alignas(32) Buffer from[mostRows] = {}, to[mostRows];
     Buffer* next = from;

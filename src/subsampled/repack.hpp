@@ -66,6 +66,13 @@ bool streamToPacked(int samples, int steps, const layouts::Packed<order, u8>& ta
     return true;
 }
 
+/// Between images with a plane of luma.
+template <class Source, class Target> void copyLuma(const Source& source, const Target& target, int width, int height)
+{
+    frame::copyPlane8u(source.first[0], static_cast<int>(source.step[0]), target.first[0],
+                       static_cast<int>(target.step[0]), width, height);
+}
+
 /// Sizes off the rule's block are rounded down.
 template <class Rule, class Source, class Target>
 PyxStatus repack(RoiSize roi, const Source& source, const Target& target)
@@ -81,8 +88,7 @@ PyxStatus repack(RoiSize roi, const Source& source, const Target& target)
         }
         eachStep(from, whole<Rule::targetColumns>(target));
     } else {
-        frame::copyPlane8u(source.first[0], static_cast<int>(source.step[0]), target.first[0],
-                           static_cast<int>(target.step[0]), samples * Rule::columns, steps * Rule::rows);
+        copyLuma(source, target, samples * Rule::columns, steps * Rule::rows);
         eachStep(ChromaOf<Source>{source}, ChromaOf<Target>{target});
     }
     return pyxOk;
