@@ -118,6 +118,8 @@ Naming readName(std::string_view name)
     naming.target = naming.source;
     if (!layouts.empty()) consumeLayout(layouts, naming.target);
 
+    if (naming.target.layout == "P4") naming.source.spareFourth = false; // it goes to the fourth plane
+
     naming.source.element = naming.target.element = consumeDepth(depths);
     if (!depths.empty()) naming.target.element = consumeDepth(depths);
 
