@@ -70,10 +70,11 @@ TYPED_TEST_SUITE(PackedPixels, Models, Names);
 
 TYPED_TEST(PackedPixels, LoadsTheFieldsOfEveryPixel)
 {
-    std::array<u16, U8::count> pixels;
+    const Memory row(Placement::endAtGuard, U8::count * sizeof(u16));
+    u16* const pixels = reinterpret_cast<u16*>(row.bytes().data());
     for (int first = 0; first < 65536; first += U8::count) {
         for (int i = 0; i < U8::count; ++i) pixels[i] = static_cast<u16>(first + i);
-        const Channels channels = this->channelsOf(this->image(static_cast<const u16*>(pixels.data())).row(0).load(0));
+        const Channels channels = this->channelsOf(this->image(static_cast<const u16*>(pixels)).row(0).load(0));
         for (int i = 0; i < U8::count; ++i) {
             for (int field = 0; field < 3; ++field) {
                 ASSERT_EQ(int{channels[field][i]}, int{TypeParam::channel(pixels[i], field)})
@@ -86,13 +87,14 @@ TYPED_TEST(PackedPixels, LoadsTheFieldsOfEveryPixel)
 TYPED_TEST(PackedPixels, StoresTheLeadingBitsOfEveryByte)
 {
     support::Random random{1};
-    std::array<u16, U8::count> pixels;
+    const Memory row(Placement::endAtGuard, U8::count * sizeof(u16));
+    u16* const pixels = reinterpret_cast<u16*>(row.bytes().data());
     for (int c = 0; c < 256; ++c) {
         Channels channels;
         for (auto& channel : channels) random.fill(channel);
         channels[c % 3].fill(static_cast<u8>(c));
         channels[(c + 1) % 3].fill(static_cast<u8>(255 - c));
-        this->image(pixels.data()).row(0).store(0, this->registersOf(channels));
+        this->image(pixels).row(0).store(0, this->registersOf(channels));
         for (int i = 0; i < U8::count; ++i) {
             ASSERT_EQ(int{pixels[i]}, int{TypeParam::pixel(channels[0][i], channels[1][i], channels[2][i])})
                 << int{channels[0][i]} << ", " << int{channels[1][i]} << ", " << int{channels[2][i]};
