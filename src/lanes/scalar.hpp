@@ -98,9 +98,6 @@ inline U16 addSatU16(U16 x, U16 y) { return std::min(x.v + y.v, 65535); }
 inline U8 avgUp(U8 x, U8 y) { return (x.v + y.v + 1) >> 1; }
 inline U8 avgDown(U8 x, U8 y) { return (x.v + y.v) >> 1; }
 
-template <int WeightOfX, int WeightOfY> U16 weightedPair(U8 x, U8 y) { return WeightOfX * x.v + WeightOfY * y.v; }
-inline U8 asBytes(U16 x) { return x.v; }
-
 /// (Weights * lanes + ... + Addend) >> Shift, clamped to a byte.
 template <int Shift, int Addend, int... Weights, class... Lanes> U8 exactMean(const Lanes&... lanes)
 {

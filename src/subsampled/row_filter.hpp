@@ -11,18 +11,10 @@
 namespace pyxcc::subsampled
 {
 
-/// (8422 R + 16515 G + 3212 B + 0x84000) >> 15 by bytes: the weights are multiples of 256, 33, 65 and 13 times, less a
-/// rest of 26, 125 and 116. The rest is taken off in 256ths, rounded up, as half of it in 128ths; the half of the odd
-/// part of it, G, is made beforehand and has the rounding in it.
-struct LumaExact15 {
-    template <class Sample> PYXCC_INLINE auto operator()(const Sample& R, const Sample& G, const Sample& B) const
-    {
-        const Sample halfOfG = avgUp(G, Sample(254));
-        const auto whole = weightedPair<33, 65>(R, G) + weightedPair<13, 0>(B, halfOfG);
-        const auto rest = weightedPair<13, 62>(R, G) + weightedPair<58, 1>(B, halfOfG);
-        return asBytes((whole - (rest >> 7) + 2112) >> 7);
-    }
-};
+using namespace matrix;
+
+/// (8422 R + 16515 G + 3212 B + 0x84000) >> 15, at twice the scale.
+inline constexpr LumaExact<Weights{2 * 8422, 2 * 16515, 2 * 3212}, 2 * 0x84000> lumaExact15;
 
 /// Samples of a channel around a pair's even pixel: their sum under the taps, and the even one by itself.
 template <class Word> struct Taps {
@@ -63,7 +55,7 @@ PYXCC_INLINE auto apply(FilteredPairs<Samples>, const layouts::AfterPixel<Three<
         return Taps<wide::S16>{layouts::tapSums(x, Samples::of(row.before[channel])), layouts::lowBytes(x)};
     };
     return layouts::ChromaOfSums<2, wide::U8>{
-        LumaExact15{}(pixels.a, pixels.b, pixels.c),
+        apply(lumaExact15, pixels),
         layouts::narrowPairs(ChromaOfTaps{}(taps(pixels.a, 0), taps(pixels.b, 1), taps(pixels.c, 2)))};
 }
 

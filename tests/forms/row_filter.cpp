@@ -62,19 +62,20 @@ void expectFormulas(const std::array<Lanes, 3>& channels, const std::array<u8, 3
 
 } // namespace
 
-TEST(RowFilter, LumaByBytesIsTheFormulaOnEveryInput)
+TEST(RowFilter, LumaIsTheFormulaOnEveryInput)
 {
-    const LumaExact15 form;
     Lanes blue;
     for (int r = 0; r < 256; ++r) {
         for (int g = 0; g < 256; ++g) {
             for (int first = 0; first < 256; first += 32) {
                 for (int i = 0; i < 32; ++i) blue[i] = static_cast<u8>(first + i);
-                const Lanes y = forms::lanesOf(form(wide::U8(r), wide::U8(g), layouts::loadSamples(blue.data())));
+                const Three pixels{wide::U8(r), wide::U8(g), layouts::loadSamples(blue.data())};
+                const Lanes y = forms::lanesOf(apply(lumaExact15, pixels));
                 for (int i = 0; i < 32; ++i) {
-                    ASSERT_EQ(int{y[i]}, luma(r, g, first + i)) << r << ", " << g << ", " << first + i;
-                    const auto one = form(scalar::U8(r), scalar::U8(g), scalar::U8(first + i));
-                    ASSERT_EQ(one.v, y[i]) << "one value of " << r << ", " << g << ", " << first + i;
+                    const int b = first + i, expected = luma(r, g, b);
+                    ASSERT_EQ(int{y[i]}, expected) << r << ", " << g << ", " << b;
+                    const scalar::Byte one = lumaExact15(scalar::S16(r), scalar::S16(g), scalar::S16(b));
+                    ASSERT_EQ(int{one.v}, expected) << "one value of " << r << ", " << g << ", " << b;
                 }
             }
         }

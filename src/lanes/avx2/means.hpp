@@ -2,7 +2,6 @@
 #pragma once
 
 #include "lanes/avx2/integers.hpp"
-#include "lanes/several.hpp"
 
 #include <algorithm>
 
@@ -69,17 +68,6 @@ PYXCC_INLINE U8 avgUpBelow(int lanes, U8 x, U8 y)
     const __m256i odd = _mm256_and_si256(_mm256_xor_si256(x.v, y.v), _mm256_set1_epi8(1));
     return U8(_mm256_sub_epi8(avgUp(x, y).v, _mm256_andnot_si256(up, odd)));
 }
-
-/// WeightOfX * x + WeightOfY * y in words, of weights that are bytes with a sign, where the sum keeps to 15 bits and a
-/// sign.
-template <int WeightOfX, int WeightOfY> PYXCC_INLINE Several<U16, 2> weightedPair(U8 x, U8 y)
-{
-    const Two<S16> sums = detail::weighted<WeightOfX, WeightOfY>(x, y);
-    return several(asU16(sums.a), asU16(sums.b));
-}
-
-/// Words up to 255 as bytes.
-PYXCC_INLINE U8 asBytes(const Several<U16, 2>& x) { return narrow(Byte(x.part[0].v), Byte(x.part[1].v)); }
 
 /// (Weights * lanes + ... + Addend) >> Shift of an even number of lanes, clamped to a byte. The weights are bytes with
 /// a sign, and no sum leaves 16 bits.
