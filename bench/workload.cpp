@@ -86,6 +86,13 @@ void addParameters(Workload& work, const catalog::Export& entry)
         const catalog::ParameterType& type = entry.parameterTypes[i];
         work.call.parameters[i].number = parameter.standard[0];
         if (!type.pointer) continue;
+        if (parameter.workspace) {
+            const catalog::PlaneShape shape = catalog::workspaceOf(entry, work.call.roi);
+            work.lists.push_back(allocate(static_cast<std::size_t>(shape.rowBytes) * shape.rows));
+            work.call.parameters[i].pointer = work.lists.back().get();
+            work.call.parameters[++i].number = shape.rowBytes;
+            continue;
+        }
         work.lists.push_back(type.type == "f64" ? listOf<f64>(parameter) : listOf<f32>(parameter));
         work.call.parameters[i].pointer = work.lists.back().get();
     }

@@ -40,12 +40,15 @@ template <class T> constexpr ParameterType parameterType()
 template <class... A> void readSignature(Export& entry)
 {
     const auto read = [&entry, side = &entry.source, afterRoi = false]<class T>(std::type_identity<T>) mutable {
-        if constexpr (std::is_same_v<T, RoiSize>) {
-            afterRoi = true;
+        if constexpr (std::is_same_v<T, RoiRect>) {
+            entry.mosaic = true;
+        } else if constexpr (std::is_same_v<T, RoiSize>) {
+            afterRoi = !entry.mosaic;
         } else if (afterRoi) {
             entry.parameterTypes[entry.parameterCount++] = parameterType<T>();
         } else if constexpr (std::is_same_v<T, int>) {
             side->steps = Steps::one;
+            afterRoi = entry.mosaic && side == &entry.target;
         } else if constexpr (std::is_same_v<T, const int*>) {
             side->steps = Steps::each;
         } else {
@@ -164,6 +167,11 @@ PlaneShape shapeOf(const Side& side, int plane, RoiSize roi)
     const int count = std::max(width, 0) * samples;
     const int rowBytes = side.element == Element::bit ? (count + 7) / 8 : count * sizeOf(side.element);
     return {rowBytes, std::max(height, 0)};
+}
+
+PlaneShape workspaceOf(const Export& entry, RoiSize roi)
+{
+    return {(std::max(roi.width, 0) + 6) * sizeOf(entry.source.element), 30};
 }
 
 std::span<const Export> exports() { return table(); }

@@ -43,6 +43,8 @@ enum class Family {
     packedRgb,
     ycbcrToPacked,
     ditheredPacked,
+    cfa,
+    demosaicAhd,
     lab,
     luv,
 };
@@ -101,6 +103,7 @@ struct Parameter {
     bool aboveFront = false;              ///< what is tested is that it is above the parameter in front of it
     bool optional = false;                ///< a null pointer stands for the standard numbers
     std::span<const int> special = {};    ///< numbers with a meaning of their own, for tests to try
+    bool workspace = false;               ///< a pointer that is not tested to memory to work in, or its step
 };
 
 inline constexpr Parameter aval{"aval", 0, 255, 0, {255}};
@@ -120,6 +123,12 @@ inline constexpr Parameter vMax{"vMax", 0.5, 2, 0, {1}, pyxErrRange, true};
 /// Weights of colours. Those of three bright channels that add up to more than 1 show what is clamped and what wraps.
 inline constexpr Parameter grayWeights{
     .name = "coeffs", .low = 0, .high = 1, .count = 3, .standard = {0.299, 0.587, 0.114}, .optional = true};
+
+/// Those of mosaics. The interpolation of one pass is not looked at; the other one works in memory of the caller's.
+inline constexpr Parameter grid{"grid", 0, 3, 0, {0}, pyxErrBadArg};
+inline constexpr Parameter interpolation{"interpolation", -1000, 1000, 0, {0}};
+inline constexpr Parameter workspace{.name = "tmp", .workspace = true};
+inline constexpr Parameter workspaceStep{.name = "tmpStep", .workspace = true};
 
 /// Which band of an image a call is: the whole, some that are none, and the top, the middle and the bottom.
 inline constexpr int bandLayouts[] = {21, 21, 31, -1, 53, 0, 5, 17, 20, 1, 4, 16, 1, 4, 16};
@@ -170,6 +179,7 @@ struct Traits {
     bool wholeSteps = false;                  ///< of a step, only the whole samples count
     bool allocates = false;                   ///< takes scratch memory from the core library, for large images at least
     Beyond (*beyond)(double, RoiSize) = nullptr; ///< rows outside of the region, by the first parameter
+    int withinImagesFrom = 1;                    ///< a call of a lesser width or height goes beyond its images
 };
 
 enum class Arrangement {
@@ -207,6 +217,11 @@ struct PlaneShape {
 
 PlaneShape shapeOf(const Side& side, int plane, RoiSize roi);
 
+struct Export;
+
+/// The caller's memory that a call of that size works in, at the least.
+PlaneShape workspaceOf(const Export& entry, RoiSize roi);
+
 /// The arguments of a call, by role. An in-place export takes its image from `source`.
 struct Invocation {
     struct Value {
@@ -237,6 +252,7 @@ struct Export {
     bool stepless = false;
     int parameterCount = 0;
     std::array<ParameterType, 4> parameterTypes = {};
+    bool mosaic = false; ///< takes a region within a mosaic; a call here is for the whole
     Function function = nullptr;
 
     /// Calls the library's function, or another one of the same signature.

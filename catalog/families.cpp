@@ -56,6 +56,11 @@ constexpr FamilyInfo table[] = {
      "565."},
     {Family::ditheredPacked, "dithered-packed", "YCbCr to dithered packed RGB",
      "8-bit YCbCr and YUV to 16-bit pixels of three fields, with ordered dithering."},
+    {Family::cfa, "cfa", "Sensor mosaics in one pass",
+     "A sensor's mosaic of one colour a place to RGB, in 8 and 16 bits: means of the samples around, green along the "
+     "direction in which the picture changes less."},
+    {Family::demosaicAhd, "demosaic-ahd", "Sensor mosaics by homogeneity",
+     "A sensor's mosaic to RGB, in 8 and 16 bits: along rows or along columns, whichever makes the smoother picture."},
     {Family::lab, "lab", "Lab", "RGB to CIE L*a*b* and back: floats, 8 bits, and 16 bits of Lab with 8 of colour."},
     {Family::luv, "luv", "LUV", "RGB to CIE L*u*v* and back in 8 bits, 16 bits with and without a sign, and floats."},
 };

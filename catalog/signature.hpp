@@ -15,6 +15,8 @@ struct Cursor {
     int planes[2] = {0, 0};
     int parameter = 0;
     bool inPlace = false;
+    bool mosaic =
+        false; // its region stands in front of the target, so that the target's step is the last of the images
     bool afterRoi = false;
 };
 
@@ -25,13 +27,17 @@ template <class A> A take(Cursor& at, const Invocation& call)
         at.side = isTarget && !at.inPlace ? 1 : 0;
         return at.side == 1 ? call.target.data() : call.source.data();
     };
-    if constexpr (std::is_same_v<A, RoiSize>) {
-        at.afterRoi = true;
+    if constexpr (std::is_same_v<A, RoiRect>) {
+        at.mosaic = true;
+        return {0, 0, call.roi.width, call.roi.height};
+    } else if constexpr (std::is_same_v<A, RoiSize>) {
+        at.afterRoi = !at.mosaic;
         return call.roi;
     } else if constexpr (std::is_same_v<A, int> || std::is_arithmetic_v<A>) {
         if constexpr (std::is_same_v<A, int>) {
             if (!at.afterRoi) {
                 const int plane = at.planes[at.side] - 1;
+                at.afterRoi = at.mosaic && at.side == 1;
                 return at.side == 1 ? call.targetStep[plane] : call.sourceStep[plane];
             }
         }

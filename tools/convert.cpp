@@ -17,6 +17,23 @@ namespace
 
 Image::Rows rowsOf(const catalog::Export& entry) { return entry.stepless ? Image::Rows::tight : Image::Rows::padded; }
 
+/// Memory for a call to work in, if it takes such, tight.
+std::vector<u8> addWorkspace(const catalog::Export& entry, catalog::Invocation& invocation)
+{
+    std::vector<u8> workspace;
+    const catalog::PlaneShape shape = catalog::workspaceOf(entry, invocation.roi);
+    for (int index = 0; index < entry.parameterCount; ++index) {
+        if (!entry.traits.parameters[index].workspace) continue;
+        if (entry.parameterTypes[index].pointer) {
+            workspace.resize(static_cast<std::size_t>(shape.rowBytes) * shape.rows);
+            invocation.parameters[index].pointer = workspace.data();
+        } else {
+            invocation.parameters[index].number = shape.rowBytes;
+        }
+    }
+    return workspace;
+}
+
 Image convert(const catalog::Export& entry, const Image& image)
 {
     Image source = asSource(entry, image), target = makeTarget(entry, image.size());
@@ -31,7 +48,12 @@ PyxStatus call(const catalog::Export& entry, Image& source, Image& target, const
 {
     catalog::Invocation invocation;
     invocation.roi = source.size();
+    const int least = entry.traits.withinImagesFrom;
+    if (source.size().width < least || source.size().height < least) {
+        fail(entry.name, " takes pictures of ", least, "x", least, " and above here");
+    }
     invocation.parameters = parameters.arguments();
+    const std::vector<u8> workspace = addWorkspace(entry, invocation);
     for (int plane = 0; plane < source.planes(); ++plane) {
         invocation.source[plane] = source.plane(plane);
         invocation.sourceStep[plane] = source.step(plane);

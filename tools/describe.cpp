@@ -56,11 +56,21 @@ std::string imageArguments(const Side& side, const std::string& name, const std:
 
 std::string parameterArgument(const catalog::Parameter& parameter, const catalog::ParameterType& type)
 {
-    std::string text = std::string(type.type) + " " + std::string(parameter.name);
+    if (type.pointer && parameter.workspace) return std::string(type.type) + "* " + std::string(parameter.name);
+    std::string text = (parameter.workspace ? "int" : std::string(type.type)) + " " + std::string(parameter.name);
     if (!type.pointer) return text;
     text.insert(0, "const ");
     return text + (type.columns == 0 ? extent(parameter.count)
                                      : extent(parameter.count / type.columns) + extent(type.columns));
+}
+
+std::string parameterArguments(const catalog::Export& entry)
+{
+    std::string text;
+    for (int index = 0; index < entry.parameterCount; ++index) {
+        text += ", " + parameterArgument(entry.traits.parameters[index], entry.parameterTypes[index]);
+    }
+    return text;
 }
 
 /// The samples that stand next to each other, in the words of the model: "R G B A", "Y Cb Y Cr".
@@ -210,6 +220,10 @@ std::string parameterWords(const catalog::Parameter& parameter)
 {
     std::ostringstream text;
     text << parameter.name << ": ";
+    if (parameter.workspace) {
+        text << "memory to work in and its step, 30 rows of width + 6 samples";
+        return text.str();
+    }
     if (parameter.count > 0) text << parameter.count << " numbers of ";
     text << parameter.low << " to " << parameter.high << "; if not set";
     for (int i = 0; i < std::max(parameter.count, 1); ++i) text << (i == 0 ? " " : ",") << parameter.standard[i];
@@ -228,14 +242,15 @@ std::string conversionOf(const catalog::Export& entry)
 std::string prototypeOf(const catalog::Export& entry)
 {
     std::string text = "PyxStatus " + std::string(entry.name) + "(";
+    if (entry.mosaic) {
+        const std::string source =
+            "const " + typeOf(entry.source) + "* src, RoiRect srcRoi, RoiSize srcSize, int srcStep";
+        return text + source + ", " + imageArguments(entry.target, "dst", "") + parameterArguments(entry) + ");";
+    }
     text += entry.inPlace
                 ? imageArguments(entry.source, "srcDst", "")
                 : imageArguments(entry.source, "src", "const ") + ", " + imageArguments(entry.target, "dst", "");
-    text += ", RoiSize roi";
-    for (int index = 0; index < entry.parameterCount; ++index) {
-        text += ", " + parameterArgument(entry.traits.parameters[index], entry.parameterTypes[index]);
-    }
-    return text + ");";
+    return text + ", RoiSize roi" + parameterArguments(entry) + ");";
 }
 
 std::string sheetOf(const catalog::Export& entry)

@@ -19,7 +19,9 @@ using catalog::Parameter;
 std::string namesOf(const catalog::Export& entry)
 {
     std::vector<std::string_view> names;
-    for (int index = 0; index < entry.parameterCount; ++index) names.push_back(entry.traits.parameters[index].name);
+    for (int index = 0; index < entry.parameterCount; ++index) {
+        if (!entry.traits.parameters[index].workspace) names.push_back(entry.traits.parameters[index].name);
+    }
     return joined(names, ", ");
 }
 
@@ -66,7 +68,7 @@ void Parameters::set(const std::string& assignment)
     const auto& all = entry_->traits.parameters;
     const auto end = all.begin() + entry_->parameterCount;
     const auto at = std::ranges::find(all.begin(), end, name, &Parameter::name);
-    if (at == end) {
+    if (at == end || at->workspace) { // memory to work in is not the user's affair
         if (entry_->parameterCount == 0) fail(entry_->name, " has no parameters to set");
         fail(entry_->name, " has no parameter '", name, "'; it has ", namesOf(*entry_));
     }

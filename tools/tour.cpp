@@ -61,7 +61,8 @@ public:
             card.note = "No conversion makes its source yet.";
             return card;
         }
-        if (card.size.width < 1 || card.size.height < 1) {
+        const int least = entry.traits.withinImagesFrom;
+        if (card.size.width < least || card.size.height < least) {
             card.note = "The picture is too small.";
             return card;
         }

@@ -7,7 +7,9 @@
 
 #include "pyxcc/bt709.h"
 #include "pyxcc/cbycr422.h"
+#include "pyxcc/cfa_to_rgb.h"
 #include "pyxcc/color_twist.h"
+#include "pyxcc/demosaic_ahd.h"
 #include "pyxcc/dithered_packed.h"
 #include "pyxcc/filter_interlace.h"
 #include "pyxcc/gamma.h"

@@ -76,7 +76,7 @@ void addParameters(Faults& faults, const Export& entry)
     for (int i = 0; i < entry.parameterCount; ++i) {
         const catalog::Parameter& parameter = entry.traits.parameters[i];
         const std::string name(parameter.name);
-        if (entry.parameterTypes[i].pointer && !parameter.optional) {
+        if (entry.parameterTypes[i].pointer && !parameter.optional && !parameter.workspace) {
             faults.push_back({name + " null", [=](Invocation& call) { call.parameters[i].pointer = nullptr; }});
         }
         if (parameter.status == pyxOk) continue;

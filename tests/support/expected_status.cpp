@@ -35,7 +35,8 @@ PyxStatus checkPointers(const Export& entry, const Invocation& call)
         failed = failed || null(entry.target, call.target, call.targetArrayNull, Untested::targetArray);
     }
     for (int i = 0; i < entry.parameterCount; ++i) {
-        const bool needed = entry.parameterTypes[i].pointer && !entry.traits.parameters[i].optional;
+        const catalog::Parameter& parameter = entry.traits.parameters[i];
+        const bool needed = entry.parameterTypes[i].pointer && !parameter.optional && !parameter.workspace;
         failed = failed || (needed && !call.parameters[i].pointer);
     }
     return failed ? pyxErrNullPtr : pyxOk;

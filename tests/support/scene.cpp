@@ -115,6 +115,11 @@ void describe(std::ostream& text, std::string_view role, Stride stride, const Im
     }
 }
 
+void copyRows(const Plane& from, const Plane& to)
+{
+    for (int y = 0; y < from.geometry().shape.rows; ++y) std::ranges::copy(from.row(y), to.row(y).begin());
+}
+
 /// Rows that cover each other are in order only where each row is a conversion of its own.
 bool rowsAreIndependent(const Export& entry) { return !entry.source.chromaY && !entry.target.chromaY; }
 
@@ -155,8 +160,9 @@ std::vector<Stride> targetStrides(const Export& entry)
 RoiSize legalSize(const Export& entry, RoiSize roi)
 {
     const catalog::Minimum& minimum = entry.traits.minimum;
-    return {roundUp(std::max(roi.width, minimum.width), minimum.widthMultiple),
-            roundUp(std::max(roi.height, minimum.height), minimum.heightMultiple)};
+    const int least = entry.traits.withinImagesFrom;
+    return {roundUp(std::max({roi.width, minimum.width, least}), minimum.widthMultiple),
+            roundUp(std::max({roi.height, minimum.height, least}), minimum.heightMultiple)};
 }
 
 Scene::Scene(const Export& entry, const Recipe& recipe) : entry_(entry), recipe_(recipe)
@@ -187,6 +193,10 @@ void Scene::makeParameters(Random& random)
     for (int i = 0; i < entry_.parameterCount; ++i) {
         const catalog::Parameter& parameter = entry_.traits.parameters[i];
         if (parameter.optional && random.oneIn(5)) continue;
+        if (parameter.workspace) {
+            if (entry_.parameterTypes[i].pointer) makeWorkspace(i, random);
+            continue;
+        }
         const catalog::Element element = elementOf(entry_.parameterTypes[i]);
         const catalog::Range limits = limitsOf(element, {parameter.low, parameter.high});
         if (!entry_.parameterTypes[i].pointer) {
@@ -203,6 +213,18 @@ void Scene::makeParameters(Random& random)
         lists_[i].push_back(list);
     }
     pristineLists_ = lists_;
+}
+
+/// With some bytes between its rows, and its step behind it.
+void Scene::makeWorkspace(int parameter, Random& random)
+{
+    const catalog::Element element = entry_.source.element;
+    const int sampleBytes = catalog::sizeOf(element);
+    const catalog::PlaneShape shape = catalog::workspaceOf(entry_, recipe_.roi);
+    const int step = shape.rowBytes + sampleBytes * random.between(0, 9);
+    Plane& plane = lists_[parameter].emplace_back(geometryOf(shape, element, step), recipe_.placement, 0);
+    random.fill(plane.all());
+    numbers_[parameter + 1] = step + random.between(0, sampleBytes - 1);
 }
 
 Invocation Scene::invocation(const Image& target) const
@@ -222,7 +244,11 @@ std::optional<std::string> Scene::sourceDamage() const
 {
     if (const auto text = support::firstDifference(pristineSource_, source_)) return "the source changed: " + *text;
     for (std::size_t i = 0; i < lists_.size(); ++i) {
-        if (const auto text = support::firstDifference(pristineLists_[i], lists_[i])) {
+        Image list = lists_[i];
+        if (entry_.traits.parameters[i].workspace) { // what its rows hold is free
+            for (std::size_t k = 0; k < list.size(); ++k) copyRows(pristineLists_[i][k], list[k]);
+        }
+        if (const auto text = support::firstDifference(pristineLists_[i], list)) {
             return "parameter " + std::to_string(i) + " changed: " + *text;
         }
     }
@@ -242,7 +268,9 @@ std::string Scene::text() const
         const catalog::Parameter& parameter = entry_.traits.parameters[i];
         text << "\n  " << parameter.name << ":";
         if (lists_[i].empty() && parameter.count > 0) text << " null";
-        if (parameter.count == 0) text << ' ' << numbers_[i];
+        if (parameter.count == 0 && !entry_.parameterTypes[i].pointer) text << ' ' << numbers_[i];
+        if (parameter.workspace && !lists_[i].empty())
+            text << ' ' << lists_[i][0].geometry().shape.rowBytes << " bytes a row";
         for (int k = 0; !lists_[i].empty() && k < parameter.count; ++k) {
             const catalog::Element element = elementOf(entry_.parameterTypes[i]);
             text << ' ' << load(element, lists_[i][0].base() + k * catalog::sizeOf(element));

@@ -37,7 +37,7 @@ struct Recipe {
 std::vector<Stride> sourceStrides(const catalog::Export& entry);
 std::vector<Stride> targetStrides(const catalog::Export& entry);
 
-/// The smallest size that the export accepts and that is not below `roi`.
+/// The smallest size that the export accepts, at which it stays within its images, and that is not below `roi`.
 RoiSize legalSize(const catalog::Export& entry, RoiSize roi);
 
 class Scene
@@ -60,6 +60,7 @@ public:
 private:
     void makeImages(Random& random);
     void makeParameters(Random& random);
+    void makeWorkspace(int parameter, Random& random);
 
     const catalog::Export& entry_;
     Recipe recipe_;

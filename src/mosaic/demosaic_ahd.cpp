@@ -1,0 +1,257 @@
+// A sensor's mosaic to RGB along rows or along columns, whichever is the smoother.
+#include "pyxcc/demosaic_ahd.h"
+
+#include "frame/row_driver.hpp"
+#include "layouts/images.hpp"
+#include "mosaic/ahd_forms.hpp"
+#include "mosaic/extended_mosaic.hpp"
+#include "mosaic/sites.hpp"
+
+#include <array>
+
+using namespace pyxcc::frame;
+using namespace pyxcc::layouts;
+using namespace pyxcc::mosaic;
+
+namespace
+{
+
+/// Columns that are worked on at a time, so that what a step of the work takes and makes stays near at hand.
+constexpr int stretch = 256;
+
+/// What a call works on. Blocks of the target lie relative to (left, top).
+template <class T> struct Work {
+    ExtendedMosaic<T> mosaic;
+    s32 grid;
+    T* target;
+    int targetStep;
+    s32 left, top;
+    T* workspace;
+    std::ptrdiff_t workspaceStep;
+};
+
+/// Four rows of the caller's workspace that take turns.
+template <class T> struct Ring {
+    T* first;
+    std::ptrdiff_t step;
+
+    T* row(s32 y) const { return reinterpret_cast<T*>(rowAt(bytes(first), step, y & 3)); }
+
+    /// Those around row `y`, from a column on.
+    ThreeRows<T> around(s32 y, int column) const
+    {
+        return {{row(y - 1) + column, row(y) + column, row(y + 1) + column}};
+    }
+};
+
+/// The planes of the two candidates for a block. A row has three columns in front of the block and three behind it.
+template <class T> struct Planes {
+    struct Candidate {
+        Ring<T> red, green, blue;
+    };
+    Candidate alongRow, alongColumn;
+    Ring<T> score;
+
+    Planes(T* workspace, std::ptrdiff_t step)
+    {
+        int rings = 0;
+        for (Ring<T>* ring : {&alongRow.red, &alongRow.green, &alongRow.blue, &alongColumn.red, &alongColumn.green,
+                              &alongColumn.blue, &score}) {
+            *ring = {reinterpret_cast<T*>(rowAt(bytes(workspace), step, 4 * rings++)), step};
+        }
+    }
+};
+
+template <class T> class Block
+{
+public:
+    Block(const Work<T>& work, s32 x, s32 y, s32 width, s32 height)
+        : work_(work), planes_(work.workspace, work.workspaceStep), x_(x), y_(y), width_(width), height_(height)
+    {
+    }
+
+    /// Every row of a plane is made once: green first, then what needs the rows of green above and below it, then what
+    /// needs those of the other colours, and so on.
+    void convert() const
+    {
+        for (s32 row = y_ - 3; row < y_ + height_ + 3; ++row) {
+            fillGreen(row);
+            if (row >= y_ - 1) fillColors(row - 1);
+            if (row >= y_ + 1) fillScores(row - 2);
+            if (row >= y_ + 3) emit(row - 3);
+        }
+    }
+
+private:
+    /// Calls with each stretch of columns [from, to) of the planes.
+    template <class Step> static void eachStretch(int from, int to, const Step& step)
+    {
+        for (int at = from; at < to; at += stretch) step(at, std::min(stretch, to - at));
+    }
+
+    /// Column `column` of the planes is this one of the mosaic.
+    s32 place(int column) const { return x_ - 3 + column; }
+
+    GreenParity greenParity(s32 y, int column) const { return isGreen(siteAt(work_.grid, place(column), y)) ? 0 : 1; }
+
+    void fillGreen(s32 y) const
+    {
+        eachStretch(0, width_ + 6, [&](int column, int count) {
+            T buffers[5][stretch + 4];
+            const T* rows[5];
+            for (int i = 0; i < 5; ++i) {
+                rows[i] = work_.mosaic.samples(y + i - 2, place(column) - 2, place(column) + count + 2, buffers[i]) + 2;
+            }
+            interpolateGreen(rows, planes_.alongRow.green.row(y) + column, planes_.alongColumn.green.row(y) + column,
+                             count, greenParity(y, column));
+        });
+    }
+
+    void fillColors(s32 y) const
+    {
+        const bool redRow = isOfRedRow(siteAt(work_.grid, x_, y));
+        eachStretch(1, width_ + 5, [&](int column, int count) {
+            T buffers[3][stretch + 2];
+            ThreeRows<T> mosaic;
+            for (int i = 0; i < 3; ++i) {
+                mosaic.row[i] =
+                    work_.mosaic.samples(y + i - 1, place(column) - 1, place(column) + count + 1, buffers[i]) + 1;
+            }
+            for (const auto* candidate : {&planes_.alongRow, &planes_.alongColumn}) {
+                T* const red = candidate->red.row(y) + column;
+                T* const blue = candidate->blue.row(y) + column;
+                interpolateColors(mosaic, candidate->green.around(y, column), redRow ? red : blue, redRow ? blue : red,
+                                  count, greenParity(y, column));
+            }
+        });
+    }
+
+    void fillScores(s32 y) const
+    {
+        eachStretch(2, width_ + 4, [&](int column, int count) {
+            using Converted = LumaChroma<stretch + 2>;
+            Converted alongRow[3], alongColumn[3];
+            for (int i = 0; i < 3; ++i) {
+                convertCandidate(planes_.alongRow, y + i - 1, column - 1, alongRow[i], count + 2);
+                convertCandidate(planes_.alongColumn, y + i - 1, column - 1, alongColumn[i], count + 2);
+            }
+            scoreCandidates(Window<stretch + 2>{{&alongRow[0], &alongRow[1], &alongRow[2]}},
+                            Window<stretch + 2>{{&alongColumn[0], &alongColumn[1], &alongColumn[2]}},
+                            planes_.score.row(y) + column, count);
+        });
+    }
+
+    static void convertCandidate(const typename Planes<T>::Candidate& candidate, s32 y, int column,
+                                 LumaChroma<stretch + 2>& to, int count)
+    {
+        toLumaChroma(candidate.red.row(y) + column, candidate.green.row(y) + column, candidate.blue.row(y) + column, to,
+                     count);
+    }
+
+    void emit(s32 y) const
+    {
+        s32 last = 1;
+        u8* const target = targetRow(y);
+        eachStretch(3, width_ + 3, [&](int column, int count) {
+            s32 masks[stretch];
+            sumScores(planes_.score.around(y, column), masks, count);
+            last = decide(masks, count, last);
+            T chosen[3][stretch];
+            const auto chooseFrom = [&](const Ring<T>& alongRow, const Ring<T>& alongColumn, T* to) {
+                choose(masks, alongRow.row(y) + column, alongColumn.row(y) + column, to, count);
+            };
+            chooseFrom(planes_.alongRow.red, planes_.alongColumn.red, chosen[0]);
+            chooseFrom(planes_.alongRow.green, planes_.alongColumn.green, chosen[1]);
+            chooseFrom(planes_.alongRow.blue, planes_.alongColumn.blue, chosen[2]);
+            using Samples = pyxcc::wide::RegisterOf<T>;
+            const PlanarRow<Samples, const u8, 3> source{{{{bytes(static_cast<const T*>(chosen[0]))},
+                                                           {bytes(static_cast<const T*>(chosen[1]))},
+                                                           {bytes(static_cast<const T*>(chosen[2]))}}}};
+            const InterleavedRow<C3<Samples>, u8> pixels{target + std::ptrdiff_t{column - 3} * pixelBytes, {}};
+            convertColumns(source, pixels, 0, count, Unchanged{});
+        });
+    }
+
+    /// The first row of a block lies a whole number of samples from the target's first.
+    u8* targetRow(s32 y) const
+    {
+        const std::ptrdiff_t wholeStep = work_.targetStep / sampleSize * sampleSize;
+        return rowAt(rowAt(bytes(work_.target), wholeStep, y_ - work_.top), work_.targetStep, y - y_) +
+               std::ptrdiff_t{x_ - work_.left} * pixelBytes;
+    }
+
+    static constexpr int sampleSize = sizeof(T), pixelBytes = 3 * sampleSize;
+
+    const Work<T>& work_;
+    Planes<T> planes_;
+    s32 x_, y_, width_, height_;
+};
+
+/// The inside, which no mirrored sample reaches, and strips along the four edges. Strips of a small region go beyond
+/// it. The inside begins at a red sample and has even sizes; a negative size is rounded down.
+template <class T> void convertBlocks(const Work<T>& work, s32 width, s32 height)
+{
+    const s32 left = work.left, top = work.top, right = left + width, bottom = top + height;
+    s32 x = std::max(left, 5), y = std::max(top, 5);
+    s32 insideWidth = std::min(work.mosaic.width - 5, right) - x;
+    s32 insideHeight = std::min(work.mosaic.height - 5, bottom) - y;
+    Site first = siteAt(work.grid, x, y);
+    if (first == Site::blue || first == Site::greenOfRedRow) {
+        ++x;
+        --insideWidth;
+        first = siteAt(work.grid, x, y);
+    }
+    insideWidth &= ~1;
+    if (first == Site::greenOfBlueRow) {
+        ++y;
+        --insideHeight;
+    }
+    insideHeight &= ~1;
+
+    const s32 below = y + insideHeight, behind = x + insideWidth;
+    if (insideWidth >= 1 && insideHeight >= 1) Block<T>(work, x, y, insideWidth, insideHeight).convert();
+    if (y > top) Block<T>(work, left, top, width, y - top).convert();
+    if (bottom > below) Block<T>(work, left, below, width, bottom - below).convert();
+    if (x > left && insideHeight >= 1) Block<T>(work, left, y, x - left, insideHeight).convert();
+    if (right > behind && insideHeight >= 1) Block<T>(work, behind, y, right - behind, insideHeight).convert();
+}
+
+/// What is left of a length in front of the mosaic's end.
+s32 lengthWithin(s32 start, s32 length, s32 limit)
+{
+    return static_cast<s32>(length + std::min(std::int64_t{limit} - start - length, std::int64_t{0}));
+}
+
+template <class T>
+PyxStatus convert(const T* src, RoiRect srcRoi, RoiSize srcSize, int srcStep, T* dst, int dstStep, s32 grid, T* tmp,
+                  int tmpStep)
+{
+    const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(srcSize, 5, 5), knownGrid(grid));
+    if (failure) return failure;
+    const Work<T> work = {.mosaic = {src, srcStep, srcSize.width, srcSize.height},
+                          .grid = grid,
+                          .target = dst,
+                          .targetStep = dstStep,
+                          .left = std::max(srcRoi.x, 0),
+                          .top = std::max(srcRoi.y, 0),
+                          .workspace = tmp,
+                          .workspaceStep = tmpStep & -static_cast<int>(sizeof(T))};
+    const s32 width = lengthWithin(work.left, srcRoi.width, srcSize.width);
+    const s32 height = lengthWithin(work.top, srcRoi.height, srcSize.height);
+    if (width >= 1 && height >= 1) convertBlocks(work, width, height);
+    return pyxOk;
+}
+
+} // namespace
+
+PyxStatus PYXCC_CALL pyxiDemosaicAHD_8u_C1C3R(const u8* src, RoiRect srcRoi, RoiSize srcSize, int srcStep, u8* dst,
+                                              int dstStep, s32 grid, u8* tmp, int tmpStep)
+{
+    return convert(src, srcRoi, srcSize, srcStep, dst, dstStep, grid, tmp, tmpStep);
+}
+
+PyxStatus PYXCC_CALL pyxiDemosaicAHD_16u_C1C3R(const u16* src, RoiRect srcRoi, RoiSize srcSize, int srcStep, u16* dst,
+                                               int dstStep, s32 grid, u16* tmp, int tmpStep)
+{
+    return convert(src, srcRoi, srcSize, srcStep, dst, dstStep, grid, tmp, tmpStep);
+}
