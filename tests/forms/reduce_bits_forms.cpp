@@ -1,0 +1,180 @@
+// Fewer levels: vector instances of the forms against scalar ones, and several rows of a diffusion at once against one
+// row after the other.
+#include "rounding_modes.hpp"
+
+#include "tone/diffusion.hpp"
+#include "tone/reduce_bits_forms.hpp"
+
+#include <gtest/gtest.h>
+
+#include <numeric>
+#include <random>
+#include <type_traits>
+#include <vector>
+
+namespace
+{
+
+using namespace pyxcc;
+using namespace pyxcc::tone;
+
+template <class TypeOfDepth> class ReduceBitsForm : public testing::Test
+{
+};
+
+using Depths = testing::Types<Depth<u8, u8>, Depth<u16, u16>, Depth<s16, s16>, Depth<u16, u8>, Depth<s16, u8>,
+                              Depth<f32, u8>, Depth<f32, u16>, Depth<f32, s16>>;
+TYPED_TEST_SUITE(ReduceBitsForm, Depths);
+
+/// All samples of a source; of floats some within the range and some beyond, and what is no number.
+template <class Sample> std::vector<Sample> everySample()
+{
+    std::vector<Sample> samples(sizeof(Sample) == 1 ? 256 : 65536);
+    if constexpr (std::is_same_v<Sample, f32>) {
+        std::mt19937 random(1);
+        std::uniform_real_distribution<f32> number(-0.25f, 1.25f);
+        for (f32& sample : samples) sample = number(random);
+        const f32 special[] = {0, -0.0f, 1, 1e-7f, 1.2e-7f, 1e30f, -1e30f, INFINITY, -INFINITY, NAN, 40000, -40000};
+        std::copy(std::begin(special), std::end(special), samples.begin());
+    } else {
+        std::iota(samples.begin(), samples.end(), std::numeric_limits<Sample>::min());
+    }
+    return samples;
+}
+
+template <class Target> Target storedOf(scalar::S32 x) { return scalar::saturate<Target>(x); }
+
+/// Signed words are held to the range of unsigned ones first.
+template <class Target> Target storedFromUnsigned(scalar::S32 x)
+{
+    if constexpr (std::is_same_v<Target, s16>) {
+        return static_cast<s16>(int{scalar::saturate<u16>(x)} - 32768);
+    } else {
+        return scalar::saturate<Target>(x);
+    }
+}
+
+/// Not inline, so that all of it happens under the mode in force.
+template <class Depth, class Form>
+[[gnu::noinline]] void throughRegisters(const Form& form, const typename Depth::Source* in, const f32* thresholds,
+                                        typename Depth::Target* out)
+{
+    using Source = typename Depth::Source;
+    const auto samples = layouts::loadAsFloats<Source>(layouts::bytes(in));
+    const auto store = [&](const auto& registers) {
+        layouts::FromFloats<Source, typename Depth::Target, false>::store(layouts::bytes(out), registers);
+    };
+    if constexpr (requires { apply(form, samples); }) {
+        store(apply(form, samples));
+    } else {
+        store(apply(form, Two{samples, layouts::loadFloatsInOrderOf<Source>(thresholds)}));
+    }
+}
+
+template <class Depth, class Form>
+[[gnu::noinline]] void oneByOne(const Form& form, const typename Depth::Source* in, const f32* thresholds,
+                                typename Depth::Target* out)
+{
+    using Target = typename Depth::Target;
+    for (int i = 0; i < 32; ++i) {
+        const scalar::F32 p = workingValue(in[i]);
+        if constexpr (requires { form(p); }) {
+            out[i] = storedOf<Target>(form(p));
+        } else {
+            out[i] = storedFromUnsigned<Target>(form(p, scalar::F32(thresholds[i])));
+        }
+    }
+}
+
+template <class Depth, class Form> void expectInstancesAgree(const Form& form, f32 step)
+{
+    const auto samples = everySample<typename Depth::Source>();
+    f32 thresholds[32];
+    for (int i = 0; i < 32; ++i) thresholds[i] = step * static_cast<f32>(i - 2) / 29;
+    for (const int mode : forms::roundingModes) {
+        for (std::size_t first = 0; first < samples.size(); first += 32) {
+            typename Depth::Target wide[32], one[32];
+            forms::roundingBy(mode, [&] {
+                throughRegisters<Depth>(form, &samples[first], thresholds, wide);
+                oneByOne<Depth>(form, &samples[first], thresholds, one);
+            });
+            for (std::size_t i = 0; i < 32; ++i)
+                ASSERT_EQ(wide[i], one[i]) << "sample " << +samples[first + i] << ", mode " << mode;
+        }
+    }
+}
+
+TYPED_TEST(ReduceBitsForm, InstancesAgreeOnEverySample)
+{
+    for (const s32 count : {2, 3, 7, 100, 255, 256, 65535, 65536}) {
+        if (count > TypeParam::maxLevels) continue;
+        SCOPED_TRACE(count);
+        const Levels levels = levelsOf<typename TypeParam::Source>(count);
+        expectInstancesAgree<TypeParam>(NearestWide<TypeParam>(count), levels.step);
+        expectInstancesAgree<TypeParam>(NearestTail<TypeParam>(count), levels.step);
+        expectInstancesAgree<TypeParam>(OrderedWide<TypeParam>{levels}, levels.step);
+        expectInstancesAgree<TypeParam>(OrderedTail<TypeParam>{levels}, levels.step);
+    }
+}
+
+/// An image of one channel through a diffusion by bands of so many rows.
+template <class F32, class Neighbours, class Depth>
+[[gnu::noinline]] std::vector<typename Depth::Target> diffused(const std::vector<typename Depth::Source>& source,
+                                                               RoiSize roi, s32 count, const Noise* noise)
+{
+    constexpr int bandRows = tone::detail::lanesOf<F32>;
+    std::vector<typename Depth::Target> target(source.size());
+    tone::detail::ErrorRows<Neighbours> errorRows(roi.width);
+    const Levels levels = levelsOf<typename Depth::Source>(count);
+    for (int pass = 0; pass < 3; ++pass) { // as channels, of which the last is left
+        for (int y = 0; y < roi.height; y += bandRows) {
+            const std::ptrdiff_t first = std::ptrdiff_t{y} * roi.width;
+            const std::ptrdiff_t sourceStep = roi.width * std::ptrdiff_t{sizeof source[0]};
+            const std::ptrdiff_t targetStep = roi.width * std::ptrdiff_t{sizeof target[0]};
+            const tone::detail::Band band = {layouts::bytes(source.data() + first),
+                                             sourceStep,
+                                             layouts::bytes(target.data() + first),
+                                             targetStep,
+                                             1,
+                                             roi.width,
+                                             std::min(bandRows, roi.height - y),
+                                             y};
+            tone::detail::diffuseBand<F32, Depth>(band, levels, noise, errorRows);
+        }
+    }
+    return target;
+}
+
+template <class Neighbours, class Depth> void expectBandsAgree(const Noise* noise)
+{
+    using Source = typename Depth::Source;
+    std::mt19937 random(7);
+    const auto all = everySample<Source>();
+    for (const int mode : forms::roundingModes) {
+        for (const RoiSize roi : {RoiSize{1, 1}, {2, 3}, {1, 20}, {3, 9}, {20, 1}, {37, 2}, {130, 17}, {61, 24}}) {
+            std::vector<Source> source(static_cast<std::size_t>(roi.width) * static_cast<std::size_t>(roi.height));
+            for (Source& sample : source) sample = all[16 + random() % (all.size() - 16)];
+            for (const s32 count : {2, 5, 256}) {
+                std::vector<typename Depth::Target> atOnce, inTurn;
+                forms::roundingBy(mode, [&] {
+                    atOnce = diffused<wide::F32, Neighbours, Depth>(source, roi, count, noise);
+                    inTurn = diffused<scalar::F32, Neighbours, Depth>(source, roi, count, noise);
+                });
+                ASSERT_EQ(atOnce, inTurn) << roi.width << " x " << roi.height << ", " << count << " levels";
+            }
+        }
+    }
+}
+
+TYPED_TEST(ReduceBitsForm, RowsAtOnceAreRowsInTurn)
+{
+    Noise noise;
+    ASSERT_EQ(noise.make(-10, 100), pyxOk);
+    for (const Noise* const some : {static_cast<const Noise*>(nullptr), static_cast<const Noise*>(&noise)}) {
+        expectBandsAgree<FourNeighbours<TypeParam>, TypeParam>(some);
+        expectBandsAgree<TwelveNeighbours<in48ths>, TypeParam>(some);
+        expectBandsAgree<TwelveNeighbours<in42nds>, TypeParam>(some);
+    }
+}
+
+} // namespace
