@@ -39,6 +39,7 @@ template <class T> constexpr ParameterType parameterType()
 /// Steps and parameters as the signature has them.
 template <class... A> void readSignature(Export& entry)
 {
+    // A number behind a step is a parameter.
     const auto read = [&entry, side = &entry.source, afterRoi = false]<class T>(std::type_identity<T>) mutable {
         if constexpr (std::is_same_v<T, RoiRect>) {
             entry.mosaic = true;
@@ -47,6 +48,10 @@ template <class... A> void readSignature(Export& entry)
         } else if (afterRoi) {
             entry.parameterTypes[entry.parameterCount++] = parameterType<T>();
         } else if constexpr (std::is_same_v<T, int>) {
+            if (side->steps == Steps::one) {
+                entry.parameterTypes[entry.parameterCount++] = parameterType<T>();
+                ++entry.parametersInFront;
+            }
             side->steps = Steps::one;
             afterRoi = entry.mosaic && side == &entry.target;
         } else if constexpr (std::is_same_v<T, const int*>) {
@@ -84,6 +89,7 @@ Export describe(std::string_view name, PyxStatus(PYXCC_CALL* function)(A...), Fa
     entry.source.chromaUp = traits.sourceChromaUp;
     entry.target.chromaUp = traits.targetChromaUp;
     entry.source.byteInFront = traits.sourceByteInFront;
+    entry.target.bitsInFront = traits.targetBitsInFront;
     if (traits.wholeSteps) {
         for (Side* side : {&entry.source, &entry.target}) side->stepUnit = sizeOf(side->element);
     }
@@ -151,6 +157,16 @@ Beyond beyondTwoRows(double, RoiSize roi)
     return {};
 }
 
+bool always(const Invocation&) { return true; }
+
+bool byDitherType(const Invocation& call)
+{
+    const double noise = call.parameters[0].number, type = call.parameters[1].number;
+    return (type >= 1 && type <= 3) || (type == 4 && noise > 0);
+}
+
+bool byDitherTypeOfBits(const Invocation& call) { return call.parameters[3].number == 3; }
+
 int sizeOf(Element element) { return elements[static_cast<int>(element)].second; }
 
 std::string_view nameOf(Element element) { return elements[static_cast<int>(element)].first; }
@@ -165,7 +181,8 @@ PlaneShape shapeOf(const Side& side, int plane, RoiSize roi)
     const int height = chroma ? blocks(roi.height, side.chromaY, side.chromaUp) : roi.height;
     const int samples = chroma && side.arrangement == Arrangement::semiPlanar ? 2 : side.samples;
     const int count = std::max(width, 0) * samples;
-    const int rowBytes = side.element == Element::bit ? (count + 7) / 8 : count * sizeOf(side.element);
+    const int rowBytes =
+        side.element == Element::bit ? (side.bitsInFront + count + 7) / 8 : count * sizeOf(side.element);
     return {rowBytes, std::max(height, 0)};
 }
 

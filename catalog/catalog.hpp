@@ -40,6 +40,8 @@ enum class Family {
     ycocg,
     cbycr422,
     toneMap,
+    reduceBits,
+    reduceBits1u,
     packedRgb,
     ycbcrToPacked,
     ditheredPacked,
@@ -93,7 +95,7 @@ struct Minimum {
     int heightMultiple = 1;
 };
 
-/// An argument after the region: a number, or a pointer to `count` numbers.
+/// An argument other than images and region: a number, or a pointer to `count` numbers.
 struct Parameter {
     std::string_view name;
     double low = 0, high = 0;             ///< the values that make sense
@@ -104,6 +106,7 @@ struct Parameter {
     bool optional = false;                ///< a null pointer stands for the standard numbers
     std::span<const int> special = {};    ///< numbers with a meaning of their own, for tests to try
     bool workspace = false;               ///< a pointer that is not tested to memory to work in, or its step
+    std::span<const int> only = {};       ///< all the numbers that make sense, where not all of low to high do
 };
 
 inline constexpr Parameter aval{"aval", 0, 255, 0, {255}};
@@ -134,6 +137,22 @@ inline constexpr Parameter workspaceStep{.name = "tmpStep", .workspace = true};
 inline constexpr int bandLayouts[] = {21, 21, 31, -1, 53, 0, 5, 17, 20, 1, 4, 16, 1, 4, 16};
 inline constexpr Parameter bandLayout{.name = "layout", .low = 0, .high = 31, .standard = {21}, .special = bandLayouts};
 
+/// Fewer levels. A method that there is not does nothing.
+inline constexpr int ditherTypes[] = {0, 1, 2, 3, 4, 1, 2, 3, 4, 5};
+inline constexpr Parameter noiseAmount{"noise", 0, 100, 0, {0}, pyxErrNoise};
+inline constexpr Parameter ditherType{
+    .name = "ditherType", .low = 0, .high = 4, .standard = {4}, .special = ditherTypes};
+inline constexpr Parameter levelsOfBytes{"levels", 2, 256, 0, {4}, pyxErrLevels};
+inline constexpr Parameter levelsOfWords{"levels", 2, 65536, 0, {4}, pyxErrLevels};
+
+/// One bit a pixel.
+inline constexpr int ditherTypesOfBits[] = {0, 3};
+inline constexpr Parameter dstBitOffset{"dstBitOffset", 0, 0x7fffffff, 0, {0}, pyxErrSize};
+inline constexpr Parameter unused0{"unused0", -1000, 1000}, unused1{"unused1", -1000, 1000};
+inline constexpr Parameter ditherTypeOfBits{
+    .name = "ditherType", .low = 0, .high = 3, .standard = {0}, .status = pyxErrDitherType, .only = ditherTypesOfBits};
+inline constexpr Parameter threshold{"threshold", 0, 255, 0, {127}};
+
 /// Rows next to the region that a call touches as well.
 struct RowsBeyond {
     int lumaInFront = 0, chromaInFront = 0, chromaBehind = 0;
@@ -148,6 +167,18 @@ Beyond beyondBand(double layout, RoiSize roi);
 
 /// Those of a call that makes four rows of chroma at the least, by two rows of the source.
 Beyond beyondTwoRows(double, RoiSize roi);
+
+struct Invocation;
+
+/// Calls that take scratch memory from the core library: all of an export's, for large images at least, or those by
+/// some methods.
+bool always(const Invocation&);
+bool byDitherType(const Invocation& call);
+bool byDitherTypeOfBits(const Invocation& call);
+
+/// The most parameters that an export has.
+inline constexpr int mostParameters = 5;
+template <class T> using PerParameter = std::array<T, mostParameters>;
 
 /// What the signature tells of a parameter.
 struct ParameterType {
@@ -168,18 +199,19 @@ struct Traits {
     Untested untested = Untested::none;
     Minimum minimum = {};
     Warning warning = {};
-    std::array<Parameter, 4> parameters = {}; ///< a lone number that is not named here is `aval`
-    bool stepsTested = false;                 ///< a step below 1 yields pyxErrStep
-    bool sourceChromaUp = false;              ///< the source has a chroma sample for a part of a block, too
-    bool targetChromaUp = false;              ///< and so has the target
-    int sourceByteInFront = 0;                ///< so far in front of a row of the source one pixel wide, a byte is read
-    Range range = {};                         ///< of the source's samples
-    double tolerance = 0;                     ///< by which a target sample may be off, where its last bit is left open
-    bool followsRounding = false;             ///< an integer result depends on the caller's rounding mode
-    bool wholeSteps = false;                  ///< of a step, only the whole samples count
-    bool allocates = false;                   ///< takes scratch memory from the core library, for large images at least
-    Beyond (*beyond)(double, RoiSize) = nullptr; ///< rows outside of the region, by the first parameter
-    int withinImagesFrom = 1;                    ///< a call of a lesser width or height goes beyond its images
+    PerParameter<Parameter> parameters = {}; ///< a lone number that is not named here is `aval`
+    bool stepsTested = false;                ///< a step below 1 yields pyxErrStep
+    bool sourceChromaUp = false;             ///< the source has a chroma sample for a part of a block, too
+    bool targetChromaUp = false;             ///< and so has the target
+    int sourceByteInFront = 0;               ///< so far in front of a row of the source one pixel wide, a byte is read
+    int targetBitsInFront = 0;               ///< so many bits may lie in front of a row of the target
+    Range range = {};                        ///< of the source's samples
+    double tolerance = 0;                    ///< by which a target sample may be off, where its last bit is left open
+    bool followsRounding = false;            ///< an integer result depends on the caller's rounding mode
+    bool wholeSteps = false;                 ///< of a step, only the whole samples count
+    bool (*allocates)(const Invocation&) = nullptr; ///< which calls take scratch memory from the core library
+    Beyond (*beyond)(double, RoiSize) = nullptr;    ///< rows outside of the region, by the first parameter
+    int withinImagesFrom = 1;                       ///< a call of a lesser width or height goes beyond its images
 };
 
 enum class Arrangement {
@@ -203,6 +235,7 @@ struct Side {
     bool chromaUp = false;        ///< a part of such a block has a sample of its own
     int byteInFront = 0;          ///< so far in front of a row, if that is one pixel wide, a byte is read
     bool spareFourth = false;     ///< AC4: the fourth sample is not read, or keeps its value
+    int bitsInFront = 0;          ///< so many may lie in front of a row of bits
     int stepUnit = 1;             ///< of a step, only whole multiples of this count
 };
 
@@ -235,7 +268,7 @@ struct Invocation {
     bool sourceArrayNull = false; ///< passes null for the array of planes
     bool targetArrayNull = false;
     RoiSize roi = {0, 0};
-    std::array<Value, 4> parameters = {};
+    PerParameter<Value> parameters = {};
 };
 
 /// A function with an export's signature, which Export::call restores.
@@ -251,7 +284,8 @@ struct Export {
     bool inPlace = false;
     bool stepless = false;
     int parameterCount = 0;
-    std::array<ParameterType, 4> parameterTypes = {};
+    int parametersInFront = 0; ///< of the region; the others are behind it
+    PerParameter<ParameterType> parameterTypes = {};
     bool mosaic = false; ///< takes a region within a mosaic; a call here is for the whole
     Function function = nullptr;
 

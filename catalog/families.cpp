@@ -63,6 +63,11 @@ constexpr FamilyInfo table[] = {
      "A sensor's mosaic to RGB, in 8 and 16 bits: along rows or along columns, whichever makes the smoother picture."},
     {Family::lab, "lab", "Lab", "RGB to CIE L*a*b* and back: floats, 8 bits, and 16 bits of Lab with 8 of colour."},
     {Family::luv, "luv", "LUV", "RGB to CIE L*u*v* and back in 8 bits, 16 bits with and without a sign, and floats."},
+    {Family::reduceBits, "reduce-bits", "Fewer levels",
+     "8-bit, 16-bit and float samples to some levels of 8 or 16 bits: the nearest one, by error diffusion or by an "
+     "ordered matrix."},
+    {Family::reduceBits1u, "reduce-bits-1u", "One bit",
+     "8-bit samples to one bit a pixel, by a threshold or by error diffusion."},
 };
 
 } // namespace

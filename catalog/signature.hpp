@@ -13,6 +13,7 @@ namespace catalog::detail
 struct Cursor {
     int side = 0; // 0: source, 1: target
     int planes[2] = {0, 0};
+    bool stepTaken = false; // of the latest image pointer: a number behind it is a parameter
     int parameter = 0;
     bool inPlace = false;
     bool mosaic =
@@ -25,6 +26,7 @@ template <class A> A take(Cursor& at, const Invocation& call)
 {
     const auto image = [&](bool isTarget) {
         at.side = isTarget && !at.inPlace ? 1 : 0;
+        at.stepTaken = false;
         return at.side == 1 ? call.target.data() : call.source.data();
     };
     if constexpr (std::is_same_v<A, RoiRect>) {
@@ -35,7 +37,8 @@ template <class A> A take(Cursor& at, const Invocation& call)
         return call.roi;
     } else if constexpr (std::is_same_v<A, int> || std::is_arithmetic_v<A>) {
         if constexpr (std::is_same_v<A, int>) {
-            if (!at.afterRoi) {
+            if (!at.afterRoi && !at.stepTaken) {
+                at.stepTaken = true;
                 const int plane = at.planes[at.side] - 1;
                 at.afterRoi = at.mosaic && at.side == 1;
                 return at.side == 1 ? call.targetStep[plane] : call.sourceStep[plane];

@@ -64,10 +64,11 @@ std::string parameterArgument(const catalog::Parameter& parameter, const catalog
                                      : extent(parameter.count / type.columns) + extent(type.columns));
 }
 
-std::string parameterArguments(const catalog::Export& entry)
+/// Those from `first` on in front of `end`.
+std::string parameterArguments(const catalog::Export& entry, int first, int end)
 {
     std::string text;
-    for (int index = 0; index < entry.parameterCount; ++index) {
+    for (int index = first; index < end; ++index) {
         text += ", " + parameterArgument(entry.traits.parameters[index], entry.parameterTypes[index]);
     }
     return text;
@@ -245,12 +246,14 @@ std::string prototypeOf(const catalog::Export& entry)
     if (entry.mosaic) {
         const std::string source =
             "const " + typeOf(entry.source) + "* src, RoiRect srcRoi, RoiSize srcSize, int srcStep";
-        return text + source + ", " + imageArguments(entry.target, "dst", "") + parameterArguments(entry) + ");";
+        return text + source + ", " + imageArguments(entry.target, "dst", "") +
+               parameterArguments(entry, 0, entry.parameterCount) + ");";
     }
     text += entry.inPlace
                 ? imageArguments(entry.source, "srcDst", "")
                 : imageArguments(entry.source, "src", "const ") + ", " + imageArguments(entry.target, "dst", "");
-    return text + ", RoiSize roi" + parameterArguments(entry) + ");";
+    return text + parameterArguments(entry, 0, entry.parametersInFront) + ", RoiSize roi" +
+           parameterArguments(entry, entry.parametersInFront, entry.parameterCount) + ");";
 }
 
 std::string sheetOf(const catalog::Export& entry)

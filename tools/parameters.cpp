@@ -94,9 +94,9 @@ void Parameters::assign(int index, const std::vector<double>& numbers)
     if (type.pointer) lists_[index] = type.type == "f64" ? packed<f64>(numbers) : packed<f32>(numbers);
 }
 
-std::array<catalog::Invocation::Value, 4> Parameters::arguments() const
+catalog::PerParameter<catalog::Invocation::Value> Parameters::arguments() const
 {
-    std::array<catalog::Invocation::Value, 4> values = {};
+    catalog::PerParameter<catalog::Invocation::Value> values = {};
     for (int index = 0; index < entry_->parameterCount; ++index) {
         values[index].number = numbers_[index].front();
         if (entry_->parameterTypes[index].pointer) values[index].pointer = lists_[index].data();

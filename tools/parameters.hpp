@@ -19,14 +19,14 @@ public:
     void set(const std::string& assignment);
 
     /// For Invocation::parameters; valid as long as this object lives unchanged.
-    std::array<catalog::Invocation::Value, 4> arguments() const;
+    catalog::PerParameter<catalog::Invocation::Value> arguments() const;
 
 private:
     void assign(int index, const std::vector<double>& numbers);
 
     const catalog::Export* entry_;
-    std::array<std::vector<double>, 4> numbers_;
-    std::array<std::vector<u8>, 4> lists_; // as the pointers' element type has them
+    catalog::PerParameter<std::vector<double>> numbers_;
+    catalog::PerParameter<std::vector<u8>> lists_; // as the pointers' element type has them
 };
 
 } // namespace tool

@@ -19,6 +19,8 @@
 #include "pyxcc/lab.h"
 #include "pyxcc/luv.h"
 #include "pyxcc/packed_rgb.h"
+#include "pyxcc/reduce_bits.h"
+#include "pyxcc/reduce_bits_1u.h"
 #include "pyxcc/repack.h"
 #include "pyxcc/rgb_to_subsampled.h"
 #include "pyxcc/rgb_ycbcr.h"

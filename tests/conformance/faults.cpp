@@ -88,6 +88,7 @@ void addParameters(Faults& faults, const Export& entry)
         const bool isUnsigned = entry.parameterTypes[i].type.starts_with('u');
         for (const double value : {parameter.low - 1, parameter.high + 1}) {
             if (isUnsigned && value < 0) continue;
+            if (value > std::numeric_limits<s32>::max()) continue;
             faults.push_back(
                 {name + " is " + std::to_string(value), [=](Invocation& call) { call.parameters[i].number = value; }});
         }

@@ -83,8 +83,9 @@ PyxStatus checkParameters(const Export& entry, const Invocation& call)
     for (int i = 0; i < entry.parameterCount; ++i) {
         const catalog::Parameter& parameter = entry.traits.parameters[i];
         const double number = call.parameters[i].number;
+        const bool listed = parameter.only.empty() || std::ranges::find(parameter.only, number) != parameter.only.end();
         const bool good = parameter.aboveFront ? number > call.parameters[i - 1].number
-                                               : number >= parameter.low && number <= parameter.high;
+                                               : number >= parameter.low && number <= parameter.high && listed;
         if (parameter.status != pyxOk && !good) return parameter.status;
     }
     return pyxOk;

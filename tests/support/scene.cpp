@@ -200,6 +200,10 @@ void Scene::makeParameters(Random& random)
         const catalog::Element element = elementOf(entry_.parameterTypes[i]);
         const catalog::Range limits = limitsOf(element, {parameter.low, parameter.high});
         if (!entry_.parameterTypes[i].pointer) {
+            if (!parameter.only.empty()) {
+                numbers_[i] = random.pick(parameter.only);
+                continue;
+            }
             const bool special = !parameter.special.empty() && !random.oneIn(4);
             numbers_[i] = special ? random.pick(parameter.special) : numberFor(limits, element, random);
             continue;

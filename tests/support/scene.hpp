@@ -66,9 +66,9 @@ private:
     Recipe recipe_;
     Image source_, pristineSource_;
     Image target_;
-    std::array<double, 4> numbers_ = {};
-    std::array<Image, 4> lists_; ///< of parameters that are pointers: one plane, one row
-    std::array<Image, 4> pristineLists_;
+    catalog::PerParameter<double> numbers_ = {};
+    catalog::PerParameter<Image> lists_; ///< of parameters that are pointers: one plane, one row
+    catalog::PerParameter<Image> pristineLists_;
 };
 
 /// Runs both functions of the subject on equal targets. Tells what differs between the statuses, the targets and what

@@ -1,0 +1,30 @@
+#include "tone/reduce_bits_noise.hpp"
+
+namespace pyxcc::tone
+{
+
+PyxStatus Noise::make(f32 low, f32 high)
+{
+    amounts = frame::allocate<f32>(length);
+    if (!amounts) return pyxErrNoMemory;
+    offsets = frame::allocate<u16>(length);
+    if (!offsets) return pyxErrNoMemory;
+    NoiseGeneratorU16* ofOffsets = nullptr;
+    if (const PyxStatus failure = noiseGenInitU16(&ofOffsets, 0, 1024, 0)) return failure;
+    offsetGenerator.reset(ofOffsets);
+    NoiseGeneratorF32* ofAmounts = nullptr;
+    if (const PyxStatus failure = noiseGenInitF32(&ofAmounts, low, high, 0)) return failure;
+    amountGenerator.reset(ofAmounts);
+    if (const PyxStatus failure = noiseGenFillU16(offsets.get(), length, ofOffsets)) return failure;
+    return noiseGenFillF32(amounts.get(), length, ofAmounts);
+}
+
+void Noise::abandon()
+{
+    static_cast<void>(amounts.release());
+    static_cast<void>(offsets.release());
+    static_cast<void>(offsetGenerator.release());
+    static_cast<void>(amountGenerator.release());
+}
+
+} // namespace pyxcc::tone
