@@ -13,9 +13,6 @@ struct HalfBlock {
     __m128i v;
 };
 
-/// The samples of two chroma components, 16 of each.
-using ChromaPairs = Two<HalfBlock>;
-
 PYXCC_INLINE HalfBlock loadHalf(const u8* p) { return {_mm_loadu_si128(reinterpret_cast<const __m128i*>(p))}; }
 PYXCC_INLINE void storeHalf(u8* p, HalfBlock x) { _mm_storeu_si128(reinterpret_cast<__m128i*>(p), x.v); }
 
@@ -117,20 +114,6 @@ namespace detail
 constexpr Places halvesInTurn = {0, 8, 1, 9, 2, 10, 3, 11, 4, 12, 5, 13, 6, 14, 7, 15};
 
 } // namespace detail
-
-/// 16 interleaved pairs, taken apart.
-PYXCC_INLINE ChromaPairs splitPairs(wide::U8 x)
-{
-    const __m256i apart = detail::swapMiddle(detail::shuffle(x.v, detail::evenUnitsThenOdd<1>));
-    return {{_mm256_castsi256_si128(apart)}, {_mm256_extracti128_si256(apart, 1)}};
-}
-
-/// Interleaves the samples of two components.
-PYXCC_INLINE wide::U8 joinPairs(const ChromaPairs& x)
-{
-    const __m128i low = _mm_unpacklo_epi8(x.a.v, x.b.v), high = _mm_unpackhi_epi8(x.a.v, x.b.v);
-    return wide::U8(_mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1));
-}
 
 namespace detail
 {
