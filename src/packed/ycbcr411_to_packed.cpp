@@ -20,7 +20,7 @@ using namespace pyxcc::packed;
         if (const PyxStatus failure =                                                                                  \
                 firstFailure(notNull(src, dst), sizeAtLeast(roi, 4, 1), elementsNotNull<3>(src)))                      \
             return failure;                                                                                            \
-        eachRow(roi, p3<4>(src, srcStep), models::Target(dst, dstStep), wideThenTail<4>(invHighE, invExactB));        \
+        eachRow(roi, p3<4>(src, srcStep), models::Target(dst, dstStep), wideThenTail<4>(invHighE, invExactB));         \
         return warnIfOff(roi, 4, 1);                                                                                   \
     }
 FROM_P3_OF_FOURS(BGR555)
