@@ -142,8 +142,9 @@ template <int Full> struct LuvToRgbTail : frame::OnFloats {
         const F32 d = Y / whereLess(magnitude(vv), F32(nearZeroChroma), vv + blackLuv, vv);
         const F32 X = (uu * 2.25f) * d;
         const F32 Z = fused(F32(3.0f), d, -fused(Y, F32(5.0f), X / F32(3.0f)));
-        const F32 R = fused(-Z, F32(0.498535f), fused(X, F32(3.240479f), -(Y * 1.53715f))) + 0.5f;
-        const F32 G = fused(Z, F32(0.041556f), fused(Y, F32(1.875991f), X * -0.969256f)) + 0.5f;
+        const F32 half = 0.5f;
+        const F32 R = fused(-Z, F32(0.498535f), fused(X, F32(3.240479f), half - Y * 1.53715f));
+        const F32 G = fused(Z, F32(0.041556f), fused(Y, F32(1.875991f), half + X * -0.969256f));
         const F32 b = fused(X, F32(0.055648f), -(Y * 0.204043f));
         const auto [r, g, ofXY] = whereVisible(L, Three<F32>{R, G, b});
         const F32 ofZ = whereLess(L, F32(blackLuv), F32(0.0f), Z);
