@@ -1,11 +1,11 @@
 // The two candidates for each pixel of a mosaic, one made along rows and one along columns, and which is the smoother.
 //
-// Each form goes along a row, without a branch, so that the compiler makes vector code of it. Rows do not overlap.
+// Each form goes along a row, and the compiler makes vector code of it: there is no branch, choices are made by masks
+// of all bits or none, and the rows that are written lie apart from all others.
 #pragma once
 
 #include "pyxcc/types.h"
 
-#include <algorithm>
 #include <cstdlib>
 #include <limits>
 
@@ -27,12 +27,21 @@ namespace detail
 inline s32 greenBetween(s32 before, s32 behind, s32 at, s32 farBefore, s32 farBehind)
 {
     const s32 corrected = ((before + behind) >> 1) + ((2 * at - farBefore - farBehind) >> 2);
-    return std::max(std::min(corrected, std::max(before, behind)), std::min(before, behind));
+    const s32 least = before < behind ? before : behind, most = before < behind ? behind : before;
+    const s32 atMost = corrected < most ? corrected : most;
+    return atMost > least ? atMost : least;
 }
+
+/// All bits where the column is green.
+inline s32 greenMask(int x, GreenParity green) { return -static_cast<s32>((x & 1) == green); }
+
+inline s32 where(s32 mask, s32 yes, s32 no) { return no ^ ((yes ^ no) & mask); }
 
 template <class T> T saturated(s32 value)
 {
-    return static_cast<T>(std::max(std::min<s32>(value, std::numeric_limits<T>::max()), 0));
+    constexpr s32 most = std::numeric_limits<T>::max();
+    const s32 atLeast = value > 0 ? value : 0;
+    return static_cast<T>(atLeast < most ? atLeast : most);
 }
 
 } // namespace detail
@@ -48,9 +57,9 @@ void interpolateGreen(const T* const rows[5], T* __restrict alongRow, T* __restr
         const s32 own = at[x];
         const s32 h = detail::greenBetween(at[x - 1], at[x + 1], own, at[x - 2], at[x + 2]);
         const s32 v = detail::greenBetween(up[x], down[x], own, up2[x], down2[x]);
-        const bool isGreen = (x & 1) == green;
-        alongRow[x] = static_cast<T>(isGreen ? own : h);
-        alongColumn[x] = static_cast<T>(isGreen ? own : v);
+        const s32 atGreen = detail::greenMask(x, green);
+        alongRow[x] = static_cast<T>(detail::where(atGreen, own, h));
+        alongColumn[x] = static_cast<T>(detail::where(atGreen, own, v));
     }
 }
 
@@ -65,9 +74,10 @@ void interpolateColors(const ThreeRows<T>& mosaic, const ThreeRows<T>& greens, T
         const s32 h = (e1[x - 1] - g1[x - 1]) + (e1[x + 1] - g1[x + 1]);
         const s32 v = (e0[x] - g0[x]) + (e2[x] - g2[x]);
         const s32 d = (e0[x - 1] + e0[x + 1] + e2[x - 1] + e2[x + 1]) - (g0[x - 1] + g0[x + 1] + g2[x - 1] + g2[x + 1]);
-        const bool isGreen = (x & 1) == green;
-        const s32 own = isGreen ? g1[x] + (h >> 1) : e1[x];
-        const s32 other = g1[x] + (isGreen ? v >> 1 : d >> 2);
+        const s32 atGreen = detail::greenMask(x, green);
+        const s32 at = e1[x], greenAt = g1[x];
+        const s32 own = detail::where(atGreen, greenAt + (h >> 1), at);
+        const s32 other = greenAt + detail::where(atGreen, v >> 1, d >> 2);
         ofRow[x] = detail::saturated<T>(own);
         ofOthers[x] = detail::saturated<T>(other);
     }
@@ -81,9 +91,9 @@ template <int Columns> struct LumaChroma {
 template <class T, int Columns>
 void toLumaChroma(const T* red, const T* green, const T* blue, LumaChroma<Columns>& to, int count)
 {
-    s32* const toY = to.y;
-    s32* const toCb = to.cb;
-    s32* const toCr = to.cr;
+    s32* __restrict const toY = to.y;
+    s32* __restrict const toCb = to.cb;
+    s32* __restrict const toCr = to.cr;
     for (int x = 0; x < count; ++x) {
         const s32 r = red[x], g = green[x], b = blue[x];
         toY[x] = (66 * r + 129 * g + 25 * b + 128) >> 8;
@@ -92,11 +102,6 @@ void toLumaChroma(const T* red, const T* green, const T* blue, LumaChroma<Column
     }
 }
 
-/// Three rows of a candidate's luma and chroma; [1] is the one that is scored.
-template <int Columns> struct Window {
-    const LumaChroma<Columns>* row[3];
-};
-
 namespace detail
 {
 
@@ -104,28 +109,37 @@ struct Distance {
     s32 luma, chroma;
 };
 
+/// A row of luma and chroma as pointers, which the compiler can tell from what is written.
+struct Row {
+    const s32* __restrict y, * __restrict cb, * __restrict cr;
+
+    template <int Columns> explicit Row(const LumaChroma<Columns>& of) : y(of.y), cb(of.cb), cr(of.cr) {}
+};
+
 /// The squares of 16-bit chroma may leave 32 bits, and the sum wraps.
-template <int Columns> inline Distance between(const LumaChroma<Columns>& a, int x, const LumaChroma<Columns>& b, int y)
+inline Distance between(const Row& a, int i, const Row& b, int k)
 {
-    const u32 cb = static_cast<u32>(a.cb[x] - b.cb[y]), cr = static_cast<u32>(a.cr[x] - b.cr[y]);
-    return {std::abs(a.y[x] - b.y[y]), static_cast<s32>(cb * cb + cr * cr)};
+    const u32 cb = static_cast<u32>(a.cb[i] - b.cb[k]), cr = static_cast<u32>(a.cr[i] - b.cr[k]);
+    return {std::abs(a.y[i] - b.y[k]), static_cast<s32>(cb * cb + cr * cr)};
 }
 
-inline Distance larger(Distance a, Distance b) { return {std::max(a.luma, b.luma), std::max(a.chroma, b.chroma)}; }
-inline Distance smaller(Distance a, Distance b) { return {std::min(a.luma, b.luma), std::min(a.chroma, b.chroma)}; }
+inline s32 larger(s32 a, s32 b) { return a > b ? a : b; }
+inline s32 smaller(s32 a, s32 b) { return a < b ? a : b; }
+inline Distance larger(Distance a, Distance b) { return {larger(a.luma, b.luma), larger(a.chroma, b.chroma)}; }
+inline Distance smaller(Distance a, Distance b) { return {smaller(a.luma, b.luma), smaller(a.chroma, b.chroma)}; }
 
 inline s32 isWithin(Distance distance, Distance limit)
 {
     return static_cast<s32>(distance.luma <= limit.luma) & static_cast<s32>(distance.chroma <= limit.chroma);
 }
 
-template <int Columns> struct Around {
+/// How far a candidate is from those around it.
+struct Around {
     Distance left, right, up, down;
 
-    Around(const Window<Columns>& window, int x)
-        : left(between(*window.row[1], x - 1, *window.row[1], x)),
-          right(between(*window.row[1], x + 1, *window.row[1], x)), up(between(*window.row[0], x, *window.row[1], x)),
-          down(between(*window.row[2], x, *window.row[1], x))
+    Around(const Row& upper, const Row& middle, const Row& lower, int x)
+        : left(between(middle, x - 1, middle, x)), right(between(middle, x + 1, middle, x)),
+          up(between(upper, x, middle, x)), down(between(lower, x, middle, x))
     {
     }
 
@@ -143,11 +157,14 @@ inline constexpr s32 noScore = 4;
 /// How many more of its neighbours the candidate along the row resembles than the one along the column. The column in
 /// front of the first is at index 0.
 template <class T, int Columns>
-void scoreCandidates(const Window<Columns>& alongRow, const Window<Columns>& alongColumn, T* __restrict scores,
-                     int count)
+void scoreCandidates(const LumaChroma<Columns> (&alongRow)[3], const LumaChroma<Columns> (&alongColumn)[3],
+                     T* __restrict scores, int count)
 {
+    using detail::Row;
+    const Row h0(alongRow[0]), h1(alongRow[1]), h2(alongRow[2]);
+    const Row v0(alongColumn[0]), v1(alongColumn[1]), v2(alongColumn[2]);
     for (int x = 0; x < count; ++x) {
-        const detail::Around<Columns> h(alongRow, x + 1), v(alongColumn, x + 1);
+        const detail::Around h(h0, h1, h2, x + 1), v(v0, v1, v2, x + 1);
         const detail::Distance limit = smaller(larger(h.left, h.right), larger(v.up, v.down));
         scores[x] = static_cast<T>(h.countWithin(limit) - v.countWithin(limit) + noScore);
     }
@@ -156,10 +173,10 @@ void scoreCandidates(const Window<Columns>& alongRow, const Window<Columns>& alo
 /// Sums of three by three scores.
 template <class T> void sumScores(const ThreeRows<T>& scores, s32* __restrict sums, int count)
 {
+    const T *const s0 = scores.row[0], *const s1 = scores.row[1], *const s2 = scores.row[2];
     for (int x = 0; x < count; ++x) {
-        s32 sum = -9 * noScore;
-        for (const T* row : scores.row) sum += row[x - 1] + row[x] + row[x + 1];
-        sums[x] = sum;
+        const s32 before = s0[x - 1] + s1[x - 1] + s2[x - 1], behind = s0[x + 1] + s1[x + 1] + s2[x + 1];
+        sums[x] = before + (s0[x] + s1[x] + s2[x]) + behind - 9 * noScore;
     }
 }
 
@@ -168,16 +185,17 @@ template <class T> void sumScores(const ThreeRows<T>& scores, s32* __restrict su
 inline s32 decide(s32* sums, int count, s32 last)
 {
     for (int x = 0; x < count; ++x) {
-        last = sums[x] != 0 ? sums[x] : last;
+        const s32 sum = sums[x];
+        last = sum != 0 ? sum : last;
         sums[x] = last >> 31;
     }
     return last;
 }
 
 template <class T>
-void choose(const s32* masks, const T* alongRow, const T* alongColumn, T* __restrict chosen, int count)
+void choose(const s32* __restrict masks, const T* alongRow, const T* alongColumn, T* __restrict chosen, int count)
 {
-    for (int x = 0; x < count; ++x) chosen[x] = masks[x] != 0 ? alongColumn[x] : alongRow[x];
+    for (int x = 0; x < count; ++x) chosen[x] = static_cast<T>(detail::where(masks[x], alongColumn[x], alongRow[x]));
 }
 
 } // namespace pyxcc::mosaic

@@ -135,9 +135,7 @@ private:
                 convertCandidate(planes_.alongRow, y + i - 1, column - 1, alongRow[i], count + 2);
                 convertCandidate(planes_.alongColumn, y + i - 1, column - 1, alongColumn[i], count + 2);
             }
-            scoreCandidates(Window<stretch + 2>{{&alongRow[0], &alongRow[1], &alongRow[2]}},
-                            Window<stretch + 2>{{&alongColumn[0], &alongColumn[1], &alongColumn[2]}},
-                            planes_.score.row(y) + column, count);
+            scoreCandidates(alongRow, alongColumn, planes_.score.row(y) + column, count);
         });
     }
 
