@@ -8,6 +8,7 @@
 
 #include <cstdlib>
 #include <limits>
+#include <type_traits>
 
 namespace pyxcc::mosaic
 {
@@ -83,22 +84,24 @@ void interpolateColors(const ThreeRows<T>& mosaic, const ThreeRows<T>& greens, T
     }
 }
 
-/// Luma and chroma of a stretch of a row.
-template <int Columns> struct LumaChroma {
-    alignas(32) s32 y[Columns], cb[Columns], cr[Columns];
+/// Luma and chroma of a stretch of a row. Those of bytes fit 16 bits.
+template <class T, int Columns> struct LumaChroma {
+    using Number = std::conditional_t<sizeof(T) == 1, s16, s32>;
+    alignas(32) Number y[Columns], cb[Columns], cr[Columns];
 };
 
 template <class T, int Columns>
-void toLumaChroma(const T* red, const T* green, const T* blue, LumaChroma<Columns>& to, int count)
+void toLumaChroma(const T* red, const T* green, const T* blue, LumaChroma<T, Columns>& to, int count)
 {
-    s32* __restrict const toY = to.y;
-    s32* __restrict const toCb = to.cb;
-    s32* __restrict const toCr = to.cr;
+    using Number = typename LumaChroma<T, Columns>::Number;
+    Number* __restrict const toY = to.y;
+    Number* __restrict const toCb = to.cb;
+    Number* __restrict const toCr = to.cr;
     for (int x = 0; x < count; ++x) {
         const s32 r = red[x], g = green[x], b = blue[x];
-        toY[x] = (66 * r + 129 * g + 25 * b + 128) >> 8;
-        toCb[x] = (-38 * r - 74 * g + 112 * b + 128) >> 8;
-        toCr[x] = (112 * r - 94 * g - 18 * b + 128) >> 8;
+        toY[x] = static_cast<Number>((66 * r + 129 * g + 25 * b + 128) >> 8);
+        toCb[x] = static_cast<Number>((-38 * r - 74 * g + 112 * b + 128) >> 8);
+        toCr[x] = static_cast<Number>((112 * r - 94 * g - 18 * b + 128) >> 8);
     }
 }
 
@@ -110,17 +113,22 @@ struct Distance {
 };
 
 /// A row of luma and chroma as pointers, which the compiler can tell from what is written.
-struct Row {
-    const s32* __restrict y, * __restrict cb, * __restrict cr;
+template <class Number> struct Row {
+    const Number* __restrict y, * __restrict cb, * __restrict cr;
 
-    template <int Columns> explicit Row(const LumaChroma<Columns>& of) : y(of.y), cb(of.cb), cr(of.cr) {}
+    template <class LumaChroma> explicit Row(const LumaChroma& of) : y(of.y), cb(of.cb), cr(of.cr) {}
 };
 
 /// The squares of 16-bit chroma may leave 32 bits, and the sum wraps.
-inline Distance between(const Row& a, int i, const Row& b, int k)
+inline s32 square(s16 x) { return x * x; }
+inline u32 square(s32 x) { return static_cast<u32>(x) * static_cast<u32>(x); }
+
+/// Differences are no wider than the numbers.
+template <class Number> Distance between(const Row<Number>& a, int i, const Row<Number>& b, int k)
 {
-    const u32 cb = static_cast<u32>(a.cb[i] - b.cb[k]), cr = static_cast<u32>(a.cr[i] - b.cr[k]);
-    return {std::abs(a.y[i] - b.y[k]), static_cast<s32>(cb * cb + cr * cr)};
+    const auto y = static_cast<Number>(a.y[i] - b.y[k]);
+    const auto cb = static_cast<Number>(a.cb[i] - b.cb[k]), cr = static_cast<Number>(a.cr[i] - b.cr[k]);
+    return {std::abs(y), static_cast<s32>(square(cb) + square(cr))};
 }
 
 inline s32 larger(s32 a, s32 b) { return a > b ? a : b; }
@@ -137,6 +145,7 @@ inline s32 isWithin(Distance distance, Distance limit)
 struct Around {
     Distance left, right, up, down;
 
+    template <class Row>
     Around(const Row& upper, const Row& middle, const Row& lower, int x)
         : left(between(middle, x - 1, middle, x)), right(between(middle, x + 1, middle, x)),
           up(between(upper, x, middle, x)), down(between(lower, x, middle, x))
@@ -157,10 +166,10 @@ inline constexpr s32 noScore = 4;
 /// How many more of its neighbours the candidate along the row resembles than the one along the column. The column in
 /// front of the first is at index 0.
 template <class T, int Columns>
-void scoreCandidates(const LumaChroma<Columns> (&alongRow)[3], const LumaChroma<Columns> (&alongColumn)[3],
+void scoreCandidates(const LumaChroma<T, Columns> (&alongRow)[3], const LumaChroma<T, Columns> (&alongColumn)[3],
                      T* __restrict scores, int count)
 {
-    using detail::Row;
+    using Row = detail::Row<typename LumaChroma<T, Columns>::Number>;
     const Row h0(alongRow[0]), h1(alongRow[1]), h2(alongRow[2]);
     const Row v0(alongColumn[0]), v1(alongColumn[1]), v2(alongColumn[2]);
     for (int x = 0; x < count; ++x) {

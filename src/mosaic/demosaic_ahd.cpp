@@ -129,7 +129,7 @@ private:
     void fillScores(s32 y) const
     {
         eachStretch(2, width_ + 4, [&](int column, int count) {
-            using Converted = LumaChroma<stretch + 2>;
+            using Converted = LumaChroma<T, stretch + 2>;
             Converted alongRow[3], alongColumn[3];
             for (int i = 0; i < 3; ++i) {
                 convertCandidate(planes_.alongRow, y + i - 1, column - 1, alongRow[i], count + 2);
@@ -140,7 +140,7 @@ private:
     }
 
     static void convertCandidate(const typename Planes<T>::Candidate& candidate, s32 y, int column,
-                                 LumaChroma<stretch + 2>& to, int count)
+                                 LumaChroma<T, stretch + 2>& to, int count)
     {
         toLumaChroma(candidate.red.row(y) + column, candidate.green.row(y) + column, candidate.blue.row(y) + column, to,
                      count);
