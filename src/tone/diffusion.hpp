@@ -23,20 +23,19 @@ namespace detail
 {
 
 /// The error rows above the row to come, nearest first, and a spare one. Margins of what a kernel reaches stay zero.
-template <class Neighbours> struct ErrorRows {
-    static constexpr int rows = Neighbours::rows, reach = Neighbours::reach;
+template <class Number, int Rows> struct ErrorRows {
+    frame::Scratch<Number> memory;
+    std::array<Number*, Rows> row = {};
 
-    frame::Scratch<f32> memory;
-    std::array<f32*, rows> row = {};
-
-    explicit ErrorRows(int width)
+    /// Of so many numbers each, from the first column on, with margins around them.
+    ErrorRows(s32 length, int margin)
     {
-        if (width > 0x7fffffff / rows - 2 * reach) return;
-        const s32 length = width + 2 * reach;
-        memory = frame::allocate<f32>(rows * length);
+        if (length > 0x7fffffff / Rows - 2 * margin) return;
+        const s32 whole = length + 2 * margin;
+        memory = frame::allocate<Number>(Rows * whole);
         if (!memory) return;
-        std::fill_n(memory.get(), rows * length, 0.0f);
-        for (int i = 0; i < rows; ++i) row[i] = memory.get() + static_cast<std::ptrdiff_t>(i) * length + reach;
+        std::fill_n(memory.get(), Rows * whole, Number{0});
+        for (int i = 0; i < Rows; ++i) row[i] = memory.get() + static_cast<std::ptrdiff_t>(i) * whole + margin;
     }
 };
 
@@ -52,142 +51,168 @@ struct Band {
 
 template <class Lane> inline constexpr int lanesOf = 1;
 template <> inline constexpr int lanesOf<wide::F32> = wide::F32::count;
+template <> inline constexpr int lanesOf<wide::S32> = wide::S32::count;
 
 /// Samples of a band on their way to lanes and back, for some steps: a step is a column of the first row, and one
 /// further to the left of each row below.
-template <int Lanes, int Lag> struct Stage {
+template <class Number, int Lanes, int Lag> struct Stage {
     static constexpr int steps = 64;
 
-    f32 samples[steps][Lanes] = {};
-    f32 thresholds[steps][Lanes] = {};
+    Number samples[steps][Lanes] = {};
+    Number thresholds[steps][Lanes] = {};
     s32 results[steps][Lanes];
 
-    /// Calls `visit` with the step, the row and the column of each pixel of the steps from `first` on.
-    template <class Visit> static void eachPixel(const Band& band, int first, const Visit& visit)
+    /// Calls `visit` with the row, its first and its last but one column and the step of the first one, for the steps
+    /// from `first` on.
+    template <class Visit> static void eachRow(const Band& band, int first, const Visit& visit)
     {
         for (int r = 0; r < band.rows; ++r) {
             const int behind = Lag * r;
             const int from = std::max(first, behind), to = std::min(first + steps, band.width + behind);
-            for (int t = from; t < to; ++t) visit(t - first, r, t - behind);
+            if (from < to) visit(r, from - behind, to - behind, from - first);
         }
     }
 
-    template <class Source> void fetch(const Band& band, int first)
+    /// `sampleAt(row, x)` is the number of a pixel, in bytes from the row's start on.
+    template <class SampleAt> void fetch(const Band& band, int first, const SampleAt& sampleAt)
     {
-        eachPixel(band, first, [&](int step, int r, int x) {
-            Source sample;
+        eachRow(band, first, [&](int r, int from, int to, int step) {
             const u8* const row = band.source + band.sourceStep * r;
-            std::memcpy(&sample, row + std::ptrdiff_t{x} * band.pixelSamples * std::ptrdiff_t{sizeof sample},
-                        sizeof sample);
-            samples[step][r] = workingValue(sample);
-        });
-    }
-
-    void fetchThresholds(const Band& band, int first, const Noise& noise)
-    {
-        eachPixel(band, first, [&](int step, int r, int x) { thresholds[step][r] = noise.at(x, band.firstRow + r); });
-    }
-
-    template <class Target> void put(const Band& band, int first) const
-    {
-        eachPixel(band, first, [&](int step, int r, int x) {
-            const Target sample = static_cast<Target>(results[step][r]);
-            u8* const row = band.target + band.targetStep * r;
-            std::memcpy(row + std::ptrdiff_t{x} * band.pixelSamples * std::ptrdiff_t{sizeof sample}, &sample,
-                        sizeof sample);
+            for (int x = from; x < to; ++x, ++step) samples[step][r] = sampleAt(row, x);
         });
     }
 };
 
-/// What a value is stored as.
-template <class Depth, class Neighbours, class F32> PYXCC_INLINE auto storedLevel(const F32& level)
-{
-    const auto integer = stored<Depth, Neighbours::rounded>(level);
-    return std::is_same_v<typename Depth::Target, s16> ? integer - 32768 : integer;
-}
-
 /// What lies around the lanes' samples. From step to step all of it moves to the left.
-template <class F32, class Neighbours> struct Surroundings {
-    static constexpr int reach = Neighbours::reach, lag = reach + 1;
-
-    Errors<F32> errors;
+template <class Lane, int Reach> struct Surroundings {
+    Errors<Lane> errors;
 
     Surroundings()
     {
-        errors.left.fill(F32(0));
-        errors.above.fill(F32(0));
-        errors.twoAbove.fill(F32(0));
+        errors.left.fill(Lane(0));
+        errors.above.fill(Lane(0));
+        errors.twoAbove.fill(Lane(0));
     }
 
     /// Takes in the errors of the samples before, and what the error rows have for the first row's next column.
-    PYXCC_INLINE void advance(const F32& error, const f32& above, const f32* twoAbove)
+    template <class Number> PYXCC_INLINE void advance(const Lane& error, const Number& above, const Number* twoAbove)
     {
         auto& e = errors;
-        constexpr int last = 2 + reach;
-        if constexpr (reach == 2) {
+        constexpr int last = 2 + Reach, lag = Reach + 1;
+        if constexpr (Reach == 2) {
             // The row above that of a lane's neighbour was there `lag` steps ago.
-            const F32 next = fromLaneInFront(e.above[last - lag + 1], *twoAbove);
+            const Lane next = fromLaneInFront(e.above[last - lag + 1], *twoAbove);
             for (int i = 0; i < last; ++i) e.twoAbove[i] = e.twoAbove[i + 1];
             e.twoAbove[last] = next;
         }
-        for (int i = 2 - reach; i < last; ++i) e.above[i] = e.above[i + 1];
+        for (int i = 2 - Reach; i < last; ++i) e.above[i] = e.above[i + 1];
         e.above[last] = fromLaneInFront(error, above);
         e.left[1] = e.left[0];
         e.left[0] = error;
     }
 };
 
-template <class F32, class Depth, class Neighbours>
-void diffuseBand(const Band& band, const Levels& levels, const Noise* noise, ErrorRows<Neighbours>& errorRows)
+/// What the samples of some lanes leave, and what they become.
+template <class Lane, class Result> struct Diffused {
+    Lane error;
+    Result result;
+};
+
+template <class Lane, class Kernel, class Number, int Rows>
+void diffuseBand(const Band& band, const Kernel& kernel, ErrorRows<Number, Rows>& errorRows)
 {
-    using Around = Surroundings<F32, Neighbours>;
-    constexpr int lanes = lanesOf<F32>, lag = Around::lag, reach = Around::reach;
+    constexpr int lanes = lanesOf<Lane>, reach = Kernel::reach, lag = reach + 1;
     auto& row = errorRows.row;
-    f32* const above = row[0];
-    f32* const twoAbove = Neighbours::rows == 3 ? row[1] : nullptr;
+    Number* const above = row[0];
+    Number* const twoAbove = Rows == 3 ? row[1] : nullptr;
 
     // Errors are read further to the right than they are written, so that they can take the place of those before. But
     // after a lone row the one above it is still needed.
-    const bool rotates = Neighbours::rows == 3 && band.rows == 1;
-    f32* const newAbove = rotates ? row[Neighbours::rows - 1] : above;
+    const bool rotates = Rows == 3 && band.rows == 1;
+    Number* const newAbove = rotates ? row[Rows - 1] : above;
 
-    Around around;
-    const auto columnBehind = [&](int t) { return std::min(t + reach, band.width + reach - 1); };
-    const auto advance = [&](int t, const F32& error) PYXCC_INLINE_LAMBDA {
-        const int x = columnBehind(t);
-        around.advance(error, above[x], Neighbours::rows == 3 ? twoAbove + x : nullptr);
+    Surroundings<Lane, reach> around;
+    const auto advance = [&](int t, const Lane& error) PYXCC_INLINE_LAMBDA {
+        const int x = std::min(t + reach, band.width + reach - 1);
+        around.advance(error, above[x], Rows == 3 ? twoAbove + x : nullptr);
     };
-    for (int t = -2 * reach; t < 0; ++t) advance(t, F32(0));
+    for (int t = -2 * reach; t < 0; ++t) advance(t, Lane(0));
 
-    Stage<lanes, lag> stage;
-    for (auto& ofStep : stage.thresholds) std::fill_n(ofStep, lanes, levels.step * 0.5f);
-    F32 error = 0;
+    Stage<Number, lanes, lag> stage;
+    Lane error(0);
     const int end = band.width + lag * (band.rows - 1);
     for (int first = 0; first < end; first += stage.steps) {
-        stage.template fetch<typename Depth::Source>(band, first);
-        if (noise) stage.fetchThresholds(band, first, *noise);
+        kernel.fetch(stage, band, first);
         const int steps = std::min(stage.steps, end - first);
         for (int i = 0; i < steps; ++i) {
             const int t = first + i;
             advance(t, error);
-            const F32 v = Neighbours::value(loadLanes(stage.samples[i], F32()), around.errors);
-            const auto result = quantised<typename Depth::Source>(levels, v, loadLanes(stage.thresholds[i], F32()));
-            storeLanes(stage.results[i], storedLevel<Depth, Neighbours>(result.level));
-            error = zeroOutside(result.error, t, lag, band.width);
+            const auto done =
+                kernel(loadLanes(stage.samples[i], Lane()), loadLanes(stage.thresholds[i], Lane()), around.errors);
+            storeLanes(stage.results[i], done.result);
+            error = zeroOutside(done.error, t, lag, band.width);
 
-            f32 errors[lanes];
+            Number errors[lanes];
             storeLanes(errors, error);
-            const auto keep = [&](f32* to, int r) {
+            const auto keep = [&](Number* to, int r) {
                 const int x = t - lag * r;
                 if (x >= 0 && x < band.width) to[x] = errors[r];
             };
             keep(newAbove, band.rows - 1);
-            if (Neighbours::rows == 3 && band.rows > 1) keep(twoAbove, band.rows - 2);
+            if (Rows == 3 && band.rows > 1) keep(twoAbove, band.rows - 2);
         }
-        stage.template put<typename Depth::Target>(band, first);
+        kernel.put(stage, band, first);
     }
     if (rotates) std::rotate(row.begin(), row.end() - 1, row.end());
 }
+
+/// Samples of a depth become levels.
+template <class Depth, class Neighbours> struct LevelDiffusion {
+    static constexpr int reach = Neighbours::reach;
+
+    Levels levels;
+    const Noise* noise; ///< or null
+
+    template <class Stage> void fetch(Stage& stage, const Band& band, int first) const
+    {
+        stage.fetch(band, first, [&](const u8* row, int x) {
+            typename Depth::Source sample;
+            std::memcpy(&sample, row + std::ptrdiff_t{x} * band.pixelSamples * std::ptrdiff_t{sizeof sample},
+                        sizeof sample);
+            return workingValue(sample);
+        });
+        if (!noise) {
+            for (auto& ofStep : stage.thresholds) std::fill(std::begin(ofStep), std::end(ofStep), levels.step * 0.5f);
+            return;
+        }
+        stage.eachRow(band, first, [&](int r, int from, int to, int step) {
+            for (int x = from; x < to; ++x, ++step) stage.thresholds[step][r] = noise->at(x, band.firstRow + r);
+        });
+    }
+
+    template <class F32>
+    PYXCC_INLINE auto operator()(const F32& p, const F32& threshold, const Errors<F32>& errors) const
+    {
+        const F32 v = Neighbours::value(p, errors);
+        const Quantised<F32> to = quantised<typename Depth::Source>(levels, v, threshold);
+        const auto integer = stored<Depth, Neighbours::rounded>(to.level);
+        return Diffused<F32, std::remove_const_t<decltype(integer)>>{
+            to.error, std::is_same_v<typename Depth::Target, s16> ? integer - 32768 : integer};
+    }
+
+    template <class Stage> void put(const Stage& stage, const Band& band, int first) const
+    {
+        using Target = typename Depth::Target;
+        stage.eachRow(band, first, [&](int r, int from, int to, int step) {
+            u8* const row = band.target + band.targetStep * r;
+            for (int x = from; x < to; ++x, ++step) {
+                const Target sample = static_cast<Target>(stage.results[step][r]);
+                std::memcpy(row + std::ptrdiff_t{x} * band.pixelSamples * std::ptrdiff_t{sizeof sample}, &sample,
+                            sizeof sample);
+            }
+        });
+    }
+};
 
 template <class Pixel, class Neighbours, class Depth> PyxStatus diffuse(const ReduceBits<Depth>& call)
 {
@@ -199,7 +224,7 @@ template <class Pixel, class Neighbours, class Depth> PyxStatus diffuse(const Re
         const f32 high = static_cast<f32>(amount + 50) * levels.step / 100.0f;
         if (const PyxStatus failure = noise.make(low, high)) return failure;
     }
-    ErrorRows<Neighbours> errorRows(call.roi.width);
+    ErrorRows<f32, Neighbours::rows> errorRows(call.roi.width, Neighbours::reach);
     if (!errorRows.memory) {
         noise.abandon(); // what there was of memory by then has never been given back
         return pyxErrNoMemory;
@@ -217,7 +242,8 @@ template <class Pixel, class Neighbours, class Depth> PyxStatus diffuse(const Re
                                call.roi.width,
                                std::min(lanes, call.roi.height - y),
                                y};
-            diffuseBand<wide::F32, Depth>(band, levels, call.noise > 0 ? &noise : nullptr, errorRows);
+            diffuseBand<wide::F32>(band, LevelDiffusion<Depth, Neighbours>{levels, call.noise > 0 ? &noise : nullptr},
+                                   errorRows);
         }
     }
     return pyxOk;

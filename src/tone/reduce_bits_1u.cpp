@@ -3,13 +3,13 @@
 
 #include "frame/checks.hpp"
 #include "frame/number_checks.hpp"
-#include "frame/scratch.hpp"
 #include "lanes/avx2/bits.hpp"
 #include "layouts/bit_rows.hpp"
 #include "layouts/rows.hpp"
+#include "tone/diffusion.hpp"
 
 #include <algorithm>
-#include <array>
+#include <iterator>
 
 using namespace pyxcc;
 using namespace pyxcc::frame;
@@ -42,49 +42,49 @@ void takeByThreshold(const u8* source, const BitRow& target, int width, u8 thres
     });
 }
 
-/// Rows of errors, the oldest last, with margins of zeros.
-struct ErrorRows {
-    Scratch<s32> memory;
-    std::array<s32*, 3> row = {};
+/// Errors are eighths of a sample's unit, spread by 42nds. A set bit pays 2047 of them, where white gains 2040. All
+/// sums wrap.
+struct BitDiffusion {
+    static constexpr int reach = 2;
 
-    explicit ErrorRows(int width)
+    u8 threshold;
+    int bitOffset;
+
+    template <class Stage> void fetch(Stage& stage, const tone::detail::Band& band, int first) const
     {
-        if (width > 0x7fffffff / 4 - 12) return;
-        const s32 length = (width + 4) & ~4;
-        memory = allocate<s32>(3 * length + 12);
-        if (!memory) return;
-        std::fill_n(memory.get(), 3 * length + 12, 0);
-        row = {memory.get() + 2, memory.get() + length + 6, memory.get() + 2 * length + 10};
+        stage.fetch(band, first, [](const u8* row, int x) { return s32{row[x]}; });
+        for (auto& ofStep : stage.thresholds) std::fill(std::begin(ofStep), std::end(ofStep), threshold * 8192);
+    }
+
+    template <class S32>
+    PYXCC_INLINE auto operator()(const S32& sample, const S32& limit, const tone::Errors<S32>& errors) const
+    {
+        const auto& [left, above, twoAbove] = errors;
+        const S32 twice = twoAbove[1] + twoAbove[3] + above[0] + above[4];
+        const S32 once = twoAbove[0] + twoAbove[4];
+        const S32 fourfold = twoAbove[2] + above[1] + above[3] + left[1];
+        const S32 eightfold = above[2] + left[0];
+        const S32 sum = once + (eightfold << 3) + (fourfold << 2) + (twice << 1);
+        const S32 w = (sample << 13) + sum * S32(23);
+        const S32 isSet = isAbove(w, limit);
+        return tone::detail::Diffused<S32, S32>{(w >> 10) - (isSet & S32(2047)), isSet};
+    }
+
+    template <class Stage> void put(const Stage& stage, const tone::detail::Band& band, int first) const
+    {
+        stage.eachRow(band, first, [&](int r, int from, int to, int step) {
+            const BitRow row{band.target + band.targetStep * r, bitOffset};
+            while (from < to) {
+                const int count = std::min(block, to - from);
+                u32 bits = 0;
+                for (int i = 0; i < count; ++i) bits |= (stage.results[step + i][r] & 1u) << (31 - i);
+                row.store(from, count, bits);
+                from += count;
+                step += count;
+            }
+        });
     }
 };
-
-/// What the neighbours of a sample left, by weights of 42nds.
-s32 weightedErrors(const s32* current, const s32* above, const s32* twoAbove)
-{
-    const auto sum = [](auto... errors) { return (0u + ... + static_cast<u32>(errors)); }; // wraps
-    const u32 twice = sum(twoAbove[-1], twoAbove[1], above[-2], above[2]);
-    const u32 once = sum(twoAbove[-2], twoAbove[2]);
-    const u32 fourfold = sum(twoAbove[0], above[-1], above[1], current[-2]);
-    const u32 eightfold = sum(above[0], current[-1]);
-    return static_cast<s32>(once + 8 * eightfold + 4 * fourfold + 2 * twice);
-}
-
-/// Errors are eighths of a sample's unit. A set bit pays 2047 of them, where white gains 2040.
-void diffuse(const u8* source, const BitRow& target, int width, u8 threshold, const ErrorRows& errors)
-{
-    const auto& [current, above, twoAbove] = errors.row;
-    eachBlock(target, width, [&](int from, int count) {
-        u32 bits = 0;
-        for (int x = from; x < from + count; ++x) {
-            const u32 left = static_cast<u32>(weightedErrors(current + x, above + x, twoAbove + x)) * 23u;
-            const s32 w = static_cast<s32>((u32{source[x]} << 13) + left);
-            const bool isSet = w > threshold * 8192;
-            current[x] = (w >> 10) - (isSet ? 2047 : 0);
-            bits |= u32{isSet} << (31 - (x - from));
-        }
-        return bits;
-    });
-}
 
 } // namespace
 
@@ -100,11 +100,16 @@ PyxStatus PYXCC_CALL pyxiReduceBits_8u1u_C1R(const u8* src, int srcStep, u8* dst
         for (int y = 0; y < roi.height; ++y) takeByThreshold(rowAt(src, srcStep, y), target(y), roi.width, threshold);
         return pyxOk;
     }
-    ErrorRows errors(roi.width);
+    // Rows are of this length, and not all of it is needed.
+    const s32 length = roi.width > 0x7fffffff - 4 ? roi.width : (roi.width + 4) & ~4;
+    tone::detail::ErrorRows<s32, 3> errors(length, BitDiffusion::reach);
     if (!errors.memory) return pyxErrNoMemory;
-    for (int y = 0; y < roi.height; ++y) {
-        diffuse(rowAt(src, srcStep, y), target(y), roi.width, threshold, errors);
-        std::rotate(errors.row.begin(), errors.row.end() - 1, errors.row.end());
+    constexpr int lanes = wide::S32::count;
+    for (int y = 0; y < roi.height; y += lanes) {
+        const tone::detail::Band band = {
+            rowAt(src, srcStep, y),          srcStep, rowAt(dst, dstStep, y), dstStep, 1, roi.width,
+            std::min(lanes, roi.height - y), y};
+        tone::detail::diffuseBand<wide::S32>(band, BitDiffusion{threshold, target(y).offset}, errors);
     }
     return pyxOk;
 }

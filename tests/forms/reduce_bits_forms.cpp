@@ -124,7 +124,7 @@ template <class F32, class Neighbours, class Depth>
 {
     constexpr int bandRows = tone::detail::lanesOf<F32>;
     std::vector<typename Depth::Target> target(source.size());
-    tone::detail::ErrorRows<Neighbours> errorRows(roi.width);
+    tone::detail::ErrorRows<f32, Neighbours::rows> errorRows(roi.width, Neighbours::reach);
     const Levels levels = levelsOf<typename Depth::Source>(count);
     for (int pass = 0; pass < 3; ++pass) { // as channels, of which the last is left
         for (int y = 0; y < roi.height; y += bandRows) {
@@ -139,7 +139,8 @@ template <class F32, class Neighbours, class Depth>
                                              roi.width,
                                              std::min(bandRows, roi.height - y),
                                              y};
-            tone::detail::diffuseBand<F32, Depth>(band, levels, noise, errorRows);
+            tone::detail::diffuseBand<F32>(band, tone::detail::LevelDiffusion<Depth, Neighbours>{levels, noise},
+                                           errorRows);
         }
     }
     return target;
