@@ -21,27 +21,38 @@ template <class T> struct ThreeRows {
     const T* row[3];
 };
 
+/// What sums and differences of a few samples fit, and so do luma and chroma: the narrower, the more at once.
+template <class T> using NumberFor = std::conditional_t<sizeof(T) == 1, s16, s32>;
+
 namespace detail
 {
 
 /// The mean of two neighbours, corrected by how the colour of the place itself bends, and held between them.
-inline s32 greenBetween(s32 before, s32 behind, s32 at, s32 farBefore, s32 farBehind)
+template <class Number> Number greenBetween(Number before, Number behind, Number at, Number farBefore, Number farBehind)
 {
-    const s32 corrected = ((before + behind) >> 1) + ((2 * at - farBefore - farBehind) >> 2);
-    const s32 least = before < behind ? before : behind, most = before < behind ? behind : before;
-    const s32 atMost = corrected < most ? corrected : most;
+    const auto mean = static_cast<Number>((before + behind) >> 1);
+    const auto bend = static_cast<Number>(2 * at - farBefore - farBehind);
+    const auto corrected = static_cast<Number>(mean + (bend >> 2));
+    const Number least = before < behind ? before : behind, most = before < behind ? behind : before;
+    const Number atMost = corrected < most ? corrected : most;
     return atMost > least ? atMost : least;
 }
 
 /// All bits where the column is green.
-inline s32 greenMask(int x, GreenParity green) { return -static_cast<s32>((x & 1) == green); }
-
-inline s32 where(s32 mask, s32 yes, s32 no) { return no ^ ((yes ^ no) & mask); }
-
-template <class T> T saturated(s32 value)
+template <class Number> Number greenMask(int x, GreenParity green)
 {
-    constexpr s32 most = std::numeric_limits<T>::max();
-    const s32 atLeast = value > 0 ? value : 0;
+    return static_cast<Number>(-static_cast<Number>((x & 1) == green));
+}
+
+template <class Number> Number where(Number mask, Number yes, Number no)
+{
+    return static_cast<Number>(no ^ ((yes ^ no) & mask));
+}
+
+template <class T> T saturated(NumberFor<T> value)
+{
+    constexpr NumberFor<T> most = std::numeric_limits<T>::max();
+    const NumberFor<T> atLeast = value > 0 ? value : NumberFor<T>{0};
     return static_cast<T>(atLeast < most ? atLeast : most);
 }
 
@@ -54,11 +65,12 @@ void interpolateGreen(const T* const rows[5], T* __restrict alongRow, T* __restr
 {
     const T *const up2 = rows[0], *const up = rows[1], *const at = rows[2], *const down = rows[3],
                    *const down2 = rows[4];
+    using Number = NumberFor<T>;
     for (int x = 0; x < count; ++x) {
-        const s32 own = at[x];
-        const s32 h = detail::greenBetween(at[x - 1], at[x + 1], own, at[x - 2], at[x + 2]);
-        const s32 v = detail::greenBetween(up[x], down[x], own, up2[x], down2[x]);
-        const s32 atGreen = detail::greenMask(x, green);
+        const Number own = at[x];
+        const Number h = detail::greenBetween<Number>(at[x - 1], at[x + 1], own, at[x - 2], at[x + 2]);
+        const Number v = detail::greenBetween<Number>(up[x], down[x], own, up2[x], down2[x]);
+        const auto atGreen = detail::greenMask<Number>(x, green);
         alongRow[x] = static_cast<T>(detail::where(atGreen, own, h));
         alongColumn[x] = static_cast<T>(detail::where(atGreen, own, v));
     }
@@ -71,22 +83,25 @@ void interpolateColors(const ThreeRows<T>& mosaic, const ThreeRows<T>& greens, T
 {
     const T *const e0 = mosaic.row[0], *const e1 = mosaic.row[1], *const e2 = mosaic.row[2];
     const T *const g0 = greens.row[0], *const g1 = greens.row[1], *const g2 = greens.row[2];
+    using Number = NumberFor<T>;
     for (int x = 0; x < count; ++x) {
-        const s32 h = (e1[x - 1] - g1[x - 1]) + (e1[x + 1] - g1[x + 1]);
-        const s32 v = (e0[x] - g0[x]) + (e2[x] - g2[x]);
-        const s32 d = (e0[x - 1] + e0[x + 1] + e2[x - 1] + e2[x + 1]) - (g0[x - 1] + g0[x + 1] + g2[x - 1] + g2[x + 1]);
-        const s32 atGreen = detail::greenMask(x, green);
-        const s32 at = e1[x], greenAt = g1[x];
-        const s32 own = detail::where(atGreen, greenAt + (h >> 1), at);
-        const s32 other = greenAt + detail::where(atGreen, v >> 1, d >> 2);
-        ofRow[x] = detail::saturated<T>(own);
-        ofOthers[x] = detail::saturated<T>(other);
+        const auto h = static_cast<Number>((e1[x - 1] - g1[x - 1]) + (e1[x + 1] - g1[x + 1]));
+        const auto v = static_cast<Number>((e0[x] - g0[x]) + (e2[x] - g2[x]));
+        const auto before = static_cast<Number>((e0[x - 1] - g0[x - 1]) + (e2[x - 1] - g2[x - 1]));
+        const auto behind = static_cast<Number>((e0[x + 1] - g0[x + 1]) + (e2[x + 1] - g2[x + 1]));
+        const auto d = static_cast<Number>(before + behind);
+        const auto atGreen = detail::greenMask<Number>(x, green);
+        const Number at = e1[x], greenAt = g1[x];
+        const auto besides = static_cast<Number>(greenAt + (h >> 1));
+        const auto across = static_cast<Number>(v >> 1), diagonal = static_cast<Number>(d >> 2);
+        ofRow[x] = detail::saturated<T>(detail::where(atGreen, besides, at));
+        ofOthers[x] = detail::saturated<T>(static_cast<Number>(greenAt + detail::where(atGreen, across, diagonal)));
     }
 }
 
-/// Luma and chroma of a stretch of a row. Those of bytes fit 16 bits.
+/// Luma and chroma of a stretch of a row.
 template <class T, int Columns> struct LumaChroma {
-    using Number = std::conditional_t<sizeof(T) == 1, s16, s32>;
+    using Number = NumberFor<T>;
     alignas(32) Number y[Columns], cb[Columns], cr[Columns];
 };
 
@@ -204,7 +219,8 @@ inline s32 decide(s32* sums, int count, s32 last)
 template <class T>
 void choose(const s32* __restrict masks, const T* alongRow, const T* alongColumn, T* __restrict chosen, int count)
 {
-    for (int x = 0; x < count; ++x) chosen[x] = static_cast<T>(detail::where(masks[x], alongColumn[x], alongRow[x]));
+    for (int x = 0; x < count; ++x)
+        chosen[x] = static_cast<T>(detail::where<s32>(masks[x], alongColumn[x], alongRow[x]));
 }
 
 } // namespace pyxcc::mosaic
