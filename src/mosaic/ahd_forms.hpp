@@ -181,7 +181,7 @@ inline constexpr s32 noScore = 4;
 /// How many more of its neighbours the candidate along the row resembles than the one along the column. The column in
 /// front of the first is at index 0.
 template <class T, int Columns>
-void scoreCandidates(const LumaChroma<T, Columns> (&alongRow)[3], const LumaChroma<T, Columns> (&alongColumn)[3],
+void scoreCandidates(const LumaChroma<T, Columns> alongRow[3], const LumaChroma<T, Columns> alongColumn[3],
                      T* __restrict scores, int count)
 {
     using Row = detail::Row<typename LumaChroma<T, Columns>::Number>;

@@ -30,12 +30,12 @@ template <class T> struct Work {
     std::ptrdiff_t workspaceStep;
 };
 
-/// Four rows of the caller's workspace that take turns.
-template <class T> struct Ring {
+/// Rows of the caller's workspace that take turns.
+template <class T, int Rows> struct Ring {
     T* first;
     std::ptrdiff_t step;
 
-    T* row(s32 y) const { return reinterpret_cast<T*>(rowAt(bytes(first), step, y & 3)); }
+    T* row(s32 y) const { return reinterpret_cast<T*>(rowAt(bytes(first), step, (y % Rows + Rows) % Rows)); }
 
     /// Those around row `y`, from a column on.
     ThreeRows<T> around(s32 y, int column) const
@@ -47,18 +47,25 @@ template <class T> struct Ring {
 /// The planes of the two candidates for a block. A row has three columns in front of the block and three behind it.
 template <class T> struct Planes {
     struct Candidate {
-        Ring<T> red, green, blue;
+        Ring<T, 4> red, blue;
+        Ring<T, 5> green;
     };
     Candidate alongRow, alongColumn;
-    Ring<T> score;
+    Ring<T, 4> score;
 
     Planes(T* workspace, std::ptrdiff_t step)
     {
-        int rings = 0;
-        for (Ring<T>* ring : {&alongRow.red, &alongRow.green, &alongRow.blue, &alongColumn.red, &alongColumn.green,
-                              &alongColumn.blue, &score}) {
-            *ring = {reinterpret_cast<T*>(rowAt(bytes(workspace), step, 4 * rings++)), step};
+        int rows = 0;
+        const auto take = [&]<int Rows>(Ring<T, Rows>& ring) {
+            ring = {reinterpret_cast<T*>(rowAt(bytes(workspace), step, rows)), step};
+            rows += Rows;
+        };
+        for (Candidate* candidate : {&alongRow, &alongColumn}) {
+            take(candidate->red);
+            take(candidate->blue);
+            take(candidate->green);
         }
+        take(score);
     }
 };
 
@@ -71,14 +78,20 @@ public:
     }
 
     /// Every row of a plane is made once: green first, then what needs the rows of green above and below it, then what
-    /// needs those of the other colours, and so on.
+    /// needs those of the other colours, and so on. Scores are made two rows at a time, which have their luma and
+    /// chroma in common.
     void convert() const
     {
-        for (s32 row = y_ - 3; row < y_ + height_ + 3; ++row) {
-            fillGreen(row);
-            if (row >= y_ - 1) fillColors(row - 1);
-            if (row >= y_ + 1) fillScores(row - 2);
-            if (row >= y_ + 3) emit(row - 3);
+        const s32 scored = y_ + height_ + 1; // rows of scores end in front of this one
+        s32 green = y_ - 3, target = y_;
+        for (s32 row = y_ - 1; row < scored; row += 2) {
+            const int rows = std::min(2, scored - row);
+            for (; green <= row + rows + 1; ++green) {
+                fillGreen(green);
+                if (green >= y_ - 1) fillColors(green - 1);
+            }
+            fillScores(row, rows);
+            for (; target < row + rows - 1; ++target) emit(target);
         }
     }
 
@@ -126,16 +139,17 @@ private:
         });
     }
 
-    void fillScores(s32 y) const
+    void fillScores(s32 y, int rows) const
     {
         eachStretch(2, width_ + 4, [&](int column, int count) {
-            using Converted = LumaChroma<T, stretch + 2>;
-            Converted alongRow[3], alongColumn[3];
-            for (int i = 0; i < 3; ++i) {
+            LumaChroma<T, stretch + 2> alongRow[4], alongColumn[4];
+            for (int i = 0; i < rows + 2; ++i) {
                 convertCandidate(planes_.alongRow, y + i - 1, column - 1, alongRow[i], count + 2);
                 convertCandidate(planes_.alongColumn, y + i - 1, column - 1, alongColumn[i], count + 2);
             }
-            scoreCandidates(alongRow, alongColumn, planes_.score.row(y) + column, count);
+            for (int i = 0; i < rows; ++i) {
+                scoreCandidates(alongRow + i, alongColumn + i, planes_.score.row(y + i) + column, count);
+            }
         });
     }
 
@@ -155,7 +169,7 @@ private:
             sumScores(planes_.score.around(y, column), masks, count);
             last = decide(masks, count, last);
             T chosen[3][stretch];
-            const auto chooseFrom = [&](const Ring<T>& alongRow, const Ring<T>& alongColumn, T* to) {
+            const auto chooseFrom = [&](const auto& alongRow, const auto& alongColumn, T* to) {
                 choose(masks, alongRow.row(y) + column, alongColumn.row(y) + column, to, count);
             };
             chooseFrom(planes_.alongRow.red, planes_.alongColumn.red, chosen[0]);
