@@ -49,14 +49,13 @@ template <const TwelveWeights& weights> struct TwelveNeighbours {
 
     template <class F32> static PYXCC_INLINE F32 value(const F32& p, const Errors<F32>& errors)
     {
-        const auto& [left, above, twoAbove] = errors;
         const auto rowsAbove = [&](int i) PYXCC_INLINE_LAMBDA {
-            return fused(F32(weights.twoAbove[i]), twoAbove[i], F32(weights.above[i]) * above[i]);
+            return fused(F32(weights.twoAbove[i]), errors.twoAbove[i], F32(weights.above[i]) * errors.above[i]);
         };
-        const F32 l0 = fused(F32(weights.left[1]), left[1], rowsAbove(0));
-        const F32 l1 = fused(F32(weights.left[0]), left[0], rowsAbove(1));
+        const F32 l0 = fused(F32(weights.left[1]), errors.left[1], rowsAbove(0));
+        const F32 l1 = fused(F32(weights.left[0]), errors.left[0], rowsAbove(1));
         const F32 sum = (l0 + rowsAbove(2)) + (l1 + rowsAbove(3));
-        return p + (sum + twoAbove[4] + above[4] * F32(weights.above[4])) * F32(weights.divisor);
+        return p + (sum + errors.twoAbove[4] + errors.above[4] * F32(weights.above[4])) * F32(weights.divisor);
     }
 };
 
