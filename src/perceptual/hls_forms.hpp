@@ -4,6 +4,7 @@
 
 #include "frame/float_forms.hpp"
 #include "perceptual/hue_scale.hpp"
+#include "perceptual/reciprocals.hpp"
 
 namespace pyxcc::perceptual
 {
@@ -35,13 +36,6 @@ template <class F32> struct Third {
 template <class Sample, class F32> PYXCC_INLINE F32 saturationUnit(const F32& sum)
 {
     return greater(lesser(sum, F32(2 * HueScale<Sample>::full) - sum), F32(1));
-}
-
-/// The reciprocal in the tails, refined without fused operations.
-template <class F32> PYXCC_INLINE F32 refined(const F32& v)
-{
-    const F32 x = rcp(v);
-    return (x + x) - ((v * x) * x);
 }
 
 /// RGB to HLS, what is left of a row.

@@ -16,7 +16,7 @@ namespace
 auto toLuvOfFloats() { return wideThenTail<8>(RgbToLuvOfFloats(127.998046875f), RgbToLuvOfFloatsTail{}); }
 auto toLuvOfFloatsAC4() { return wideThenTail<4>(RgbToLuvOfFloats(128.0f), RgbToLuvOfFloatsTail{}); }
 auto toRgbOfFloats() { return wideThenTail<8>(LuvToRgbOfFloats{}, LuvToRgbOfFloatsTail{}); }
-auto toRgbOfBytes() { return wideThenTail<8>(LuvToRgbOfBytes{}, LuvToRgbTail<255>{}); }
+auto toRgbOfBytes() { return wideThenTail<8>(LuvToRgbOfBytesC3{}, LuvToRgbTail<255>{}); }
 
 template <class Rounding> auto toLuvOfWords()
 {

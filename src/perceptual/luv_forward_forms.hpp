@@ -4,6 +4,7 @@
 
 #include "frame/float_forms.hpp"
 #include "perceptual/cube_root.hpp"
+#include "perceptual/reciprocals.hpp"
 #include "perceptual/xyz_of_rgb.hpp"
 
 namespace pyxcc::perceptual
@@ -14,14 +15,6 @@ inline constexpr f32 un = 0.197839f, vn = 0.468342f; ///< chroma of white
 
 /// What floats have of the series.
 inline constexpr LastTerms luvLastTerms = {0.01900117f, 0.015834307f};
-
-/// x is near 1 / v, and this is nearer.
-template <class F32> PYXCC_INLINE F32 nearer(const F32& x, const F32& v)
-{
-    return fused(-x, fused(x, v, F32(-1.0f)), x);
-}
-
-template <class F32> PYXCC_INLINE F32 plainlyNearer(const F32& x, const F32& v) { return (x + x) - ((v * x) * x); }
 
 /// u and v over 13 L.
 template <class F32> struct LuvChroma {
@@ -35,7 +28,7 @@ template <class F32> PYXCC_INLINE F32 luvDenominator(const F32& X, const F32& Y,
 
 template <class F32> PYXCC_INLINE LuvChroma<F32> luvChroma(const F32& X, const F32& Y, const F32& denominator)
 {
-    const F32 e = nearer(rcp(denominator), denominator);
+    const F32 e = refinedByFused(denominator);
     return {fused(e, X * 4.0f, F32(-un)), fused(Y * 9.0f, e, F32(-vn))};
 }
 
@@ -50,7 +43,7 @@ template <class F32> PYXCC_INLINE LuvChroma<F32> luvChromaInBlocks(const F32& X,
 template <class F32>
 PYXCC_INLINE LuvChroma<F32> luvChromaBehindBlocks(const F32& X, const F32& Y, const F32& Z, const F32& D)
 {
-    const F32 w = plainlyNearer(rcp(D), D), zero = 0.0f;
+    const F32 w = refined(D), zero = 0.0f;
     const F32 up = whereEqual(Z, zero, zero, (X * 4.0f) * w), vp = whereEqual(Z, zero, zero, (Y * 9.0f) * w);
     return {up - un, vp - vn};
 }

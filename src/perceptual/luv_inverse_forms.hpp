@@ -2,6 +2,7 @@
 // pixels of four floats, they divide.
 #pragma once
 
+#include "perceptual/hue_scale.hpp"
 #include "perceptual/luv_forward_forms.hpp"
 
 namespace pyxcc::perceptual
@@ -29,7 +30,7 @@ template <class F32> PYXCC_INLINE F32 offZero(const F32& v)
 template <class F32> PYXCC_INLINE Three<F32> luvToRgbInBlocks(const F32& L, const F32& fL, const F32& u, const F32& v)
 {
     const F32 Y = whereLess(L, F32(luvLineEnd), L * 0.001107052f, cubed(fL));
-    const F32 q = L * 13.0f, rq = nearer(rcp(q), q);
+    const F32 q = L * 13.0f, rq = refinedByFused(q);
     const F32 uu = fused(rq, u, F32(un)), vv = offZero(fused(rq, v, F32(vn)));
     const F32 x = rcp(vv), e = fused(x, vv, F32(-1.0f));
     const F32 d = fused(-x, e, x) * Y;
@@ -76,47 +77,35 @@ struct LuvToRgbOfFloatsTail : frame::OnFloats {
 
 // Integer samples in blocks.
 
-/// The reciprocals as they come.
-struct LuvToRgbOfBytes : frame::OnFloats {
-    template <class F32> PYXCC_INLINE auto operator()(const F32& L, const F32& U, const F32& V) const
-    {
-        const F32 Lp = L * 0.39215687f, f = fused(F32(0.39215687f), L, F32(16.0f)) * 0.00862069f;
-        const F32 us = fused(F32(1.3882353f), U, F32(-134.0f)), vs = fused(V, F32(1.027451f), F32(-140.0f));
-        const F32 rq = rcp(Lp * 13.0f);
-        const F32 uu = fused(rq, us, F32(un)), x = rcp(offZero(fused(vs, rq, F32(vn))));
-        const F32 Y = whereLess(Lp, F32(luvLineEnd), Lp * 0.001107052f, cubed(f));
-        const F32 w = fused(F32(3.0f), x, F32(-5.0f));
-        const F32 X = uu * ((x * Y) * 2.25f);
-        const F32 Z = fused(-X, F32(0.33333334f), w * Y);
-        const auto [R, G, B] = multiplied<FusedSums>(rgbOfXyz, X, Y, Z);
-        return scaledToBytes(Lp, R, G, B);
-    }
-
-private:
-    template <class F32> static PYXCC_INLINE auto scaledToBytes(const F32& L, const F32& R, const F32& G, const F32& B)
-    {
-        const auto [r, g, b] = whereVisible(L, Three<F32>{R * 255.0f, G * 255.0f, B * 255.0f});
-        return Three{nearest(r), nearest(g), nearest(b)};
-    }
+struct RawReciprocal {
+    template <class F32> PYXCC_INLINE F32 operator()(const F32& v) const { return rcp(v); }
+};
+struct RefinedReciprocal {
+    template <class F32> PYXCC_INLINE F32 operator()(const F32& v) const { return refinedByFused(v); }
 };
 
-/// The same steps with refined reciprocals, and cut.
-struct LuvToRgbOfBytesAC4 : frame::OnFloats {
+/// Three channels take the reciprocals as they come and round to nearest, four refine them and are cut.
+template <class Reciprocal, class Conversion> struct LuvToRgbOfBytes : frame::OnFloats {
     template <class F32> PYXCC_INLINE auto operator()(const F32& L, const F32& U, const F32& V) const
     {
+        constexpr Reciprocal reciprocal;
+        constexpr Conversion conversion;
         const F32 Lp = L * 0.39215687f, f = fused(F32(0.39215687f), L, F32(16.0f)) * 0.00862069f;
         const F32 us = fused(F32(1.3882353f), U, F32(-134.0f)), vs = fused(V, F32(1.027451f), F32(-140.0f));
-        const F32 q = Lp * 13.0f, rq = nearer(rcp(q), q);
-        const F32 uu = fused(rq, us, F32(un)), vv = offZero(fused(vs, rq, F32(vn))), x = nearer(rcp(vv), vv);
+        const F32 rq = reciprocal(Lp * 13.0f);
+        const F32 uu = fused(rq, us, F32(un)), x = reciprocal(offZero(fused(vs, rq, F32(vn))));
         const F32 Y = whereLess(Lp, F32(luvLineEnd), Lp * 0.001107052f, cubed(f));
         const F32 w = fused(F32(3.0f), x, F32(-5.0f));
         const F32 X = uu * ((x * Y) * 2.25f);
         const F32 Z = fused(-X, F32(0.33333334f), w * Y);
         const auto [R, G, B] = multiplied<FusedSums>(rgbOfXyz, X, Y, Z);
         const auto [r, g, b] = whereVisible(Lp, Three<F32>{R * 255.0f, G * 255.0f, B * 255.0f});
-        return Three{trunc(r), trunc(g), trunc(b)};
+        return Three{conversion(r), conversion(g), conversion(b)};
     }
 };
+
+using LuvToRgbOfBytesC3 = LuvToRgbOfBytes<RawReciprocal, Nearest>;
+using LuvToRgbOfBytesAC4 = LuvToRgbOfBytes<RefinedReciprocal, Truncated>;
 
 struct LuvToRgbOfWords : frame::OnFloats {
     template <class F32> PYXCC_INLINE auto operator()(const F32& L, const F32& U, const F32& V) const

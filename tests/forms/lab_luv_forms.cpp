@@ -21,7 +21,7 @@ template <class Form> class PerceptualFormOfBytes : public testing::Test
 };
 
 using Forms = testing::Types<RgbToLab<LabOfBytes, FusedSums>, RgbToLabCut<LabOfBytes>, LabToRgb<OfLabBytes, FusedSums>,
-                             LabToRgb<OfLabBytes, PlainSums>, RgbToLuvOfBytes, RgbToLuvByPower, LuvToRgbOfBytes,
+                             LabToRgb<OfLabBytes, PlainSums>, RgbToLuvOfBytes, RgbToLuvByPower, LuvToRgbOfBytesC3,
                              LuvToRgbOfBytesAC4, LuvToRgbTail<255>>;
 
 struct Names {
