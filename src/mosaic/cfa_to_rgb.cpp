@@ -1,13 +1,17 @@
 // A sensor's mosaic to RGB by means of the samples around each.
 #include "pyxcc/cfa_to_rgb.h"
 
-#include "frame/row_driver.hpp"
-#include "mosaic/mosaic_rows.hpp"
+#include "frame/checks.hpp"
+#include "layouts/avx2/pairs_of_triples.hpp"
+#include "mosaic/halved_rows.hpp"
 #include "mosaic/sites.hpp"
 
 #include <algorithm>
 #include <cstdint>
+#include <cstdlib>
+#include <cstring>
 
+using namespace pyxcc;
 using namespace pyxcc::frame;
 using namespace pyxcc::layouts;
 using namespace pyxcc::mosaic;
@@ -32,22 +36,57 @@ template <class T> struct Work {
     {
         return bytes(target + targetPitch * (std::ptrdiff_t{y} - top) + (std::ptrdiff_t{x} - left) * 3);
     }
+
+    bool rowsAreApart() const { return std::abs(targetPitch) >= 3 * (std::ptrdiff_t{right} - left); }
+
+    /// The first column that is not in the frame.
+    s32 innerLeft() const { return std::max(left, 2); }
 };
 
-template <class Samples> using Target = InterleavedRow<C3<Samples>, u8>;
+enum class Green { plain, alongEdges };
 
-/// Takes columns of a row from a source of neighbourhoods through the form for the row's colours.
-template <template <bool, class> class Form, class T, class Source>
-void convertSpan(const Work<T>& work, s32 y, s32 from, s32 to, const Source& source)
+/// Converts `count` columns of a row from an even number of columns behind `from` on.
+template <Green green, bool siteFirst, bool redRow, class T>
+void convertPairs(const RowsAround<T>& rows, u8* target, int count)
 {
     using Samples = pyxcc::wide::RegisterOf<T>;
-    const Target<Samples> target{work.pixel(from, y), {}};
-    const Site first = siteAt(work.grid, from, y);
-    const Samples atGreen = pyxcc::wide::everyOther<Samples>(isGreen(first));
-    if (isOfRedRow(first)) {
-        convertColumns(source, target, 0, to - from, Form<true, Samples>{atGreen});
-    } else {
-        convertColumns(source, target, 0, to - from, Form<false, Samples>{atGreen});
+    const InterleavedRow<PairsOfC3<Samples>, u8> pixels{target, {}};
+    const auto colors = [&rows](std::ptrdiff_t pair) PYXCC_INLINE_LAMBDA {
+        if constexpr (green == Green::plain) {
+            return meansAround(rows.template pairs<siteFirst>(pair));
+        } else {
+            return meansAlongEdges(rows.template widePairs<siteFirst>(pair));
+        }
+    };
+    const auto inOrder = [](const Colors<Samples>& x) PYXCC_INLINE_LAMBDA {
+        const auto rgb = [](const Three<Samples>& place) PYXCC_INLINE_LAMBDA {
+            return redRow ? place : Three<Samples>{place.c, place.b, place.a};
+        };
+        return siteFirst ? Two{rgb(x.site), rgb(x.green)} : Two{rgb(x.green), rgb(x.site)};
+    };
+    constexpr int block = pixels.block;
+    const int whole = count / block * block;
+    for (int x = 0; x < whole; x += block) {
+        expectFrom<64, 1>(bytes(rows.next + x));
+        expectFrom<expectedStores + 128, 1>(pixels.pixel(x)); // the third line of the block
+        pixels.store(x, inOrder(colors(x / 2)));
+    }
+    if (whole < count) pixels.store(whole, count - whole, inOrder(colors(whole / 2)));
+}
+
+template <Green green, class T>
+void convertSpan(const Work<T>& work, s32 y, s32 from, int count, const RowsAround<T>& rows)
+{
+    u8* const target = work.pixel(from, y);
+    switch (siteAt(work.grid, from, y)) {
+    case Site::red:
+        return convertPairs<green, true, true>(rows, target, count);
+    case Site::blue:
+        return convertPairs<green, true, false>(rows, target, count);
+    case Site::greenOfRedRow:
+        return convertPairs<green, false, true>(rows, target, count);
+    case Site::greenOfBlueRow:
+        return convertPairs<green, false, false>(rows, target, count);
     }
 }
 
@@ -62,58 +101,102 @@ template <class T> void convertPixel(const Work<T>& work, s32 x, s32 y)
     const T* const middle = work.row(y);
     const T* const lower = work.row(behind(y, work.height));
     const s32 left = before(x), right = behind(x, work.width);
-    const Near<Sample> near = {middle[x],   middle[left], middle[right], upper[x],    lower[x],
-                               upper[left], upper[right], lower[left],   lower[right]};
     const Site site = siteAt(work.grid, x, y);
-    const Sample atGreen = isGreen(site) ? -1 : 0;
-    const pyxcc::Three<Sample> rgb =
-        isOfRedRow(site) ? MeansAround<true, Sample>{atGreen}(near) : MeansAround<false, Sample>{atGreen}(near);
-    const T samples[] = {rgb.a.v, rgb.b.v, rgb.c.v};
-    copyBytes(work.pixel(x, y), bytes(samples), sizeof samples);
+    Three<Sample> colors;
+    if (isGreen(site)) {
+        colors = {avgUp(Sample(middle[left]), Sample(middle[right])), middle[x],
+                  avgUp(Sample(upper[x]), Sample(lower[x]))};
+    } else {
+        const Pair<Sample> pair = {middle[x], middle[right], middle[x],    middle[left], upper[x],
+                                   lower[x],  upper[right],  lower[right], upper[left],  lower[left]};
+        colors = meansAround(pair).site;
+    }
+    const bool redRow = isOfRedRow(site);
+    const T samples[] = {(redRow ? colors.a : colors.c).v, colors.b.v, (redRow ? colors.c : colors.a).v};
+    std::memcpy(work.pixel(x, y), samples, sizeof samples);
+}
+
+/// The columns of the region without two along each edge of the mosaic, in stretches: one at least, but it may be
+/// empty.
+template <class T, class Stretch> void eachStretch(const Work<T>& work, const Stretch& of)
+{
+    const s32 to = std::max(std::min(work.right, work.width - 2), work.innerLeft());
+    s32 x = work.innerLeft();
+    do {
+        const int count = std::min(to - x, stretch);
+        of(x, count);
+        x += count;
+    } while (x < to);
 }
 
 /// A row of the frame: plain means, of mirrored samples at its ends.
 template <class T> void convertFrameRow(const Work<T>& work, s32 y)
 {
-    const s32 from = std::clamp(1, work.left, work.right), to = std::clamp(work.width - 1, from, work.right);
+    const s32 from = std::clamp(2, work.left, work.right), to = std::clamp(work.width - 2, from, work.right);
     for (s32 x = work.left; x < from; ++x) convertPixel(work, x, y);
-    convertSpan<MeansAround>(
-        work, y, from, to,
-        NearRows<T>{work.row(before(y)) + from, work.row(y) + from, work.row(behind(y, work.height)) + from});
+    eachStretch(work, [&](s32 x, int count) {
+        if (count == 0) return;
+        HalvedRow<T> upper, middle, lower;
+        upper.take(work.row(before(y)) + x, count);
+        middle.take(work.row(y) + x, count);
+        lower.take(work.row(behind(y, work.height)) + x, count);
+        convertSpan<Green::plain>(work, y, x, count, {{nullptr, &upper, &middle, &lower, nullptr}, work.row(y)});
+    });
     for (s32 x = to; x < work.right; ++x) convertPixel(work, x, y);
 }
 
-/// A column of the frame, without its two first and its two last samples.
-template <class T> void convertFrameColumn(const Work<T>& work, s32 x)
+/// Two samples at both ends of a row, as far as they are asked for.
+template <class T> void convertFrameColumns(const Work<T>& work, s32 y)
 {
-    const s32 to = std::min(work.bottom, work.height - 2);
-    for (s32 y = std::max(work.top, 2); y < to; ++y) convertPixel(work, x, y);
+    const s32 w = work.width;
+    if (work.left == 0) convertPixel(work, 0, y);
+    if (w >= 3 && (work.left == 1 || (work.left == 0 && work.right >= 2))) convertPixel(work, 1, y);
+    if (w >= 3 && work.right >= w - 1 && work.left < w - 1) convertPixel(work, w - 2, y);
+    if (work.right == w) convertPixel(work, w - 1, y);
 }
 
-/// Two samples along each edge, as far as they are asked for. A region in front of the mosaic has no part in its first
-/// edge.
-template <class T> void convertFrame(const Work<T>& work)
+/// Rows that are not in the frame, with or without what of them is. A row is taken apart once, for five of the target.
+template <class T> void convertRows(const Work<T>& work, s32 top, s32 bottom, bool withFrame)
 {
-    const s32 w = work.width, h = work.height;
+    if (top >= bottom) return;
+    eachStretch(work, [&](s32 x, int count) {
+        constexpr int ring = 8;
+        HalvedRow<T> rows[ring];
+        const auto take = [&](s32 y) {
+            if (count > 0) rows[y % ring].take(work.row(y) + x, count);
+        };
+        const auto around = [&](s32 y) {
+            RowsAround<T> of;
+            for (int i = 0; i < 5; ++i) of.row[i] = &rows[(y + i - 2) % ring];
+            of.next = work.row(y + 3) + x;
+            return of;
+        };
+        for (s32 y = top - 2; y < top + 2; ++y) take(y);
+        for (s32 y = top; y < bottom; ++y) {
+            take(y + 2);
+            if (count > 0) convertSpan<Green::alongEdges>(work, y, x, count, around(y));
+            if (withFrame && x == work.innerLeft()) convertFrameColumns(work, y);
+        }
+    });
+}
+
+/// First two samples along each edge, as far as they are asked for, then what is inside. A region in front of the
+/// mosaic has no part in its first edge. Columns of the frame go along with the rows inside, unless rows of the target
+/// overlap: each piece is then written over those in front of it, and each row over the one above.
+template <class T> void convertPieces(const Work<T>& work)
+{
+    const s32 h = work.height;
+    const s32 top = std::max(work.top, 2), bottom = std::min(work.bottom, h - 2);
+    const bool apart = work.rowsAreApart();
     if (work.top == 0) convertFrameRow(work, 0);
     if (h >= 3 && (work.top == 1 || (work.top == 0 && work.bottom >= 2))) convertFrameRow(work, 1);
-    if (work.left == 0) convertFrameColumn(work, 0);
-    if (w >= 3 && (work.left == 1 || (work.left == 0 && work.right >= 2))) convertFrameColumn(work, 1);
-    if (w >= 3 && work.right >= w - 1 && work.left < w - 1) convertFrameColumn(work, w - 2);
-    if (work.right == w) convertFrameColumn(work, w - 1);
+    for (s32 y = top; y < bottom && !apart; ++y) convertFrameColumns(work, y);
     if (h >= 3 && work.bottom >= h - 1 && work.top < h - 1) convertFrameRow(work, h - 2);
     if (work.bottom == h) convertFrameRow(work, h - 1);
-}
-
-template <class T> void convertInside(const Work<T>& work)
-{
-    const s32 from = std::max(work.left, 2), to = std::min(work.right, work.width - 2);
-    const s32 bottom = std::min(work.bottom, work.height - 2);
-    if (from >= to) return;
-    for (s32 y = std::max(work.top, 2); y < bottom; ++y) {
-        const FarRows<T> rows = {{work.row(y - 2) + from, work.row(y - 1) + from, work.row(y) + from,
-                                  work.row(y + 1) + from, work.row(y + 2) + from}};
-        convertSpan<MeansAlongEdges>(work, y, from, to, rows);
+    if (apart) {
+        convertRows(work, top, bottom, true);
+    } else {
+        for (s32 y = top; y < bottom; ++y) convertRows(work, y, y + 1, false);
     }
 }
 
@@ -141,8 +224,7 @@ PyxStatus convert(const T* src, RoiRect srcRoi, RoiSize srcSize, int srcStep, T*
                           .bottom = endOf(srcRoi.y, srcRoi.height, srcSize.height),
                           .grid = grid};
     if (work.left >= work.right || work.top >= work.bottom) return pyxOk;
-    convertFrame(work);
-    convertInside(work);
+    convertPieces(work);
     return pyxOk;
 }
 

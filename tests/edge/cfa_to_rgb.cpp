@@ -148,6 +148,24 @@ TEST(CfaToRgb, ARegionEndsWithTheMosaic)
     }
 }
 
+// Steps may be anything: where rows overlap, each is written over those above it, over its whole width.
+TEST(CfaToRgb, RowsThatOverlapAreWrittenOneAfterTheOther)
+{
+    const RoiSize size = {4300, 12};
+    const Bytes mosaic = noise<u8>(static_cast<std::size_t>(size.width) * size.height);
+    for (const int step : {0, 3, 30, -6, 12000}) {
+        const std::size_t first = step < 0 ? 100 : 0, count = 3 * 4296 + 7 * 12000 + 100;
+        Bytes whole(count, unwritten), oneByOne(count, unwritten);
+        EXPECT_EQ(pyxiCFAToRGB_8u_C1C3R(mosaic.data(), {2, 2, 4296, 8}, size, size.width, &whole[first], step, 1, 0),
+                  pyxOk);
+        for (int y = 0; y < 8; ++y) {
+            u8* const row = &oneByOne[first] + y * step;
+            EXPECT_EQ(pyxiCFAToRGB_8u_C1C3R(mosaic.data(), {2, 2 + y, 4296, 1}, size, size.width, row, 0, 1, 0), pyxOk);
+        }
+        EXPECT_EQ(whole, oneByOne) << step;
+    }
+}
+
 TEST(CfaToRgb, AnyInterpolationIsTheSame)
 {
     const Bytes mosaic = noise<u8>(64);

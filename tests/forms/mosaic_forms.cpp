@@ -1,9 +1,12 @@
-// Means of the samples around a place of a mosaic: vector instances against scalar ones, and against the sums.
+// Means of the samples around a place of a mosaic: vector instances against scalar ones, and both against plain
+// numbers.
 #include "every_input.hpp"
 
 #include "mosaic/cfa_forms.hpp"
 
+#include <cstdlib>
 #include <random>
+#include <type_traits>
 
 namespace
 {
@@ -13,6 +16,11 @@ using namespace pyxcc::mosaic;
 
 std::mt19937 numbers(5);
 
+template <class Samples> Samples exactMeanOfFour(Samples a, Samples b, Samples c, Samples d)
+{
+    return meanOfFour(a, b, c, d, avgUp(a, b), avgUp(c, d));
+}
+
 /// A mean of four depends on the two sums alone: on their halves, rounded up, and on their lowest bits.
 TEST(MeanOfFour, IsRoundedOnceForAllBytes)
 {
@@ -20,7 +28,7 @@ TEST(MeanOfFour, IsRoundedOnceForAllBytes)
         for (int second = 0; second <= 510; ++second) {
             using scalar::U8;
             const U8 a = first / 2, b = first - first / 2, c = second / 2, d = second - second / 2;
-            ASSERT_EQ(int{meanOfFour(a, b, c, d).v}, (first + second + 2) >> 2) << first << ", " << second;
+            ASSERT_EQ(int{exactMeanOfFour(a, b, c, d).v}, (first + second + 2) >> 2) << first << ", " << second;
         }
     }
 }
@@ -31,25 +39,26 @@ TEST(MeanOfFour, IsRoundedOnceForWords)
         using scalar::U16;
         const auto word = [] { return static_cast<int>(numbers() & 0xffff); };
         const int a = word(), b = word(), c = word(), d = word();
-        ASSERT_EQ(int{meanOfFour(U16(a), U16(b), U16(c), U16(d)).v}, (a + b + c + d + 2) >> 2);
+        ASSERT_EQ(int{exactMeanOfFour(U16(a), U16(b), U16(c), U16(d)).v}, (a + b + c + d + 2) >> 2);
     }
 }
 
-/// The places of a neighbourhood in one order.
-template <class Samples> std::array<Samples Far<Samples>::*, 4> farPlaces()
+/// The samples around a site and its partner, in one order.
+template <class Samples> std::array<Samples Pair<Samples>::*, 10> nearPlaces()
 {
-    using F = Far<Samples>;
-    return {&F::farLeft, &F::farRight, &F::farUp, &F::farDown};
+    using P = Pair<Samples>;
+    return {&P::site,  &P::green, &P::innerSite, &P::outerGreen, &P::above,
+            &P::below, &P::upper, &P::lower,     &P::outerUpper, &P::outerLower};
 }
-template <class Samples> std::array<Samples Near<Samples>::*, 9> nearPlaces()
+template <class Samples> std::array<Samples WidePair<Samples>::*, 3> farPlaces()
 {
-    using N = Near<Samples>;
-    return {&N::at, &N::left, &N::right, &N::up, &N::down, &N::upLeft, &N::upRight, &N::downLeft, &N::downRight};
+    using P = WidePair<Samples>;
+    return {&P::outerSite, &P::farAbove, &P::farBelow};
 }
 
 /// Random samples, of few values for equal distances to be among them.
 template <class Wide, class Scalar, class T>
-void makeFar(Far<Wide>& wide, std::array<Far<Scalar>, Wide::count>& lanes, int mask)
+void makePairs(WidePair<Wide>& wide, std::array<WidePair<Scalar>, Wide::count>& lanes, int mask)
 {
     const auto fill = [mask](Wide& to, auto&& lane) {
         std::array<T, Wide::count> values;
@@ -59,61 +68,71 @@ void makeFar(Far<Wide>& wide, std::array<Far<Scalar>, Wide::count>& lanes, int m
         }
         to = layouts::loadSamples<Wide>(reinterpret_cast<const u8*>(values.data()));
     };
-    for (std::size_t k = 0; k < 9; ++k) {
+    for (std::size_t k = 0; k < nearPlaces<Wide>().size(); ++k) {
         fill(wide.near.*nearPlaces<Wide>()[k],
              [&lanes, k](int i) -> Scalar& { return lanes[i].near.*nearPlaces<Scalar>()[k]; });
     }
-    for (std::size_t k = 0; k < 4; ++k) {
+    for (std::size_t k = 0; k < farPlaces<Wide>().size(); ++k) {
         fill(wide.*farPlaces<Wide>()[k], [&lanes, k](int i) -> Scalar& { return lanes[i].*farPlaces<Scalar>()[k]; });
     }
 }
 
-template <class Samples, class T> std::array<T, Samples::count> valuesOf(Samples x)
+using Values = std::array<int, 6>;
+
+template <class Samples> std::array<Values, Samples::count> valuesOf(const Colors<Samples>& colors)
 {
-    std::array<T, Samples::count> values;
-    layouts::storeSamples(reinterpret_cast<u8*>(values.data()), x);
+    constexpr int lanes = Samples::count;
+    using T = std::conditional_t<lanes == 32, u8, u16>;
+    std::array<Values, lanes> values;
+    const std::array channels = {colors.site.a,  colors.site.b,  colors.site.c,
+                                 colors.green.a, colors.green.b, colors.green.c};
+    for (std::size_t k = 0; k < channels.size(); ++k) {
+        std::array<T, lanes> samples;
+        layouts::storeSamples(reinterpret_cast<u8*>(samples.data()), channels[k]);
+        for (int i = 0; i < lanes; ++i) values[i][k] = samples[i];
+    }
     return values;
 }
 
-template <class T, bool redRow> void expectInstancesAgree(bool greenFirst)
+template <class T> Values valuesOf(const Colors<scalar::Lane<T>>& colors)
+{
+    return {colors.site.a.v, colors.site.b.v, colors.site.c.v, colors.green.a.v, colors.green.b.v, colors.green.c.v};
+}
+
+/// What the samples are to become, in plain numbers.
+template <class T> Values stated(const WidePair<scalar::Lane<T>>& wide, bool alongEdges)
+{
+    const Pair<scalar::Lane<T>>& x = wide.near;
+    const auto meanOf = [](auto... lanes) { return (0 + ... + lanes.v); };
+    const int alongRow = (meanOf(x.green, x.outerGreen) + 1) >> 1, alongColumn = (meanOf(x.above, x.below) + 1) >> 1;
+    int green = (meanOf(x.green, x.outerGreen, x.above, x.below) + 2) >> 2;
+    const int h = std::abs(wide.outerSite.v - x.innerSite.v), v = std::abs(wide.farAbove.v - wide.farBelow.v);
+    if (alongEdges && v < h) green = alongColumn;
+    if (alongEdges && v > h) green = alongRow;
+    const int third = (meanOf(x.upper, x.lower, x.outerUpper, x.outerLower) + 2) >> 2;
+    return {
+        x.site.v, green, third, (meanOf(x.site, x.innerSite) + 1) >> 1, x.green.v, (meanOf(x.upper, x.lower) + 1) >> 1};
+}
+
+template <class T> void expectInstancesAgree()
 {
     using Wide = wide::RegisterOf<T>;
     using Scalar = scalar::Lane<T>;
-    for (int round = 0; round < 20000; ++round) {
-        Far<Wide> wideSamples;
-        std::array<Far<Scalar>, Wide::count> lanes;
-        makeFar<Wide, Scalar, T>(wideSamples, lanes, round % 3 == 0 ? 3 : 0xffff);
-        const Wide mask = wide::everyOther<Wide>(greenFirst);
-        const Three<Wide> along = MeansAlongEdges<redRow, Wide>{mask}(wideSamples);
-        const Three<Wide> plain = MeansAround<redRow, Wide>{mask}(wideSamples.near);
-        const auto alongR = valuesOf<Wide, T>(along.a), alongG = valuesOf<Wide, T>(along.b),
-                   alongB = valuesOf<Wide, T>(along.c), plainR = valuesOf<Wide, T>(plain.a),
-                   plainG = valuesOf<Wide, T>(plain.b), plainB = valuesOf<Wide, T>(plain.c);
+    for (int round = 0; round < 3000; ++round) {
+        WidePair<Wide> pairs;
+        std::array<WidePair<Scalar>, Wide::count> lanes;
+        makePairs<Wide, Scalar, T>(pairs, lanes, round % 3 == 0 ? 3 : 0xffff);
+        const auto along = valuesOf(meansAlongEdges(pairs)), plain = valuesOf(meansAround(pairs.near));
         for (int i = 0; i < Wide::count; ++i) {
-            const Scalar green = (i % 2 == 0) == greenFirst ? -1 : 0;
-            const Three<Scalar> one = MeansAlongEdges<redRow, Scalar>{green}(lanes[i]);
-            const Three<Scalar> other = MeansAround<redRow, Scalar>{green}(lanes[i].near);
-            ASSERT_EQ((std::array{alongR[i], alongG[i], alongB[i], plainR[i], plainG[i], plainB[i]}),
-                      (std::array{one.a.v, one.b.v, one.c.v, other.a.v, other.b.v, other.c.v}))
-                << "lane " << i;
+            ASSERT_EQ(along[i], valuesOf<T>(meansAlongEdges(lanes[i]))) << "lane " << i;
+            ASSERT_EQ(along[i], stated<T>(lanes[i], true)) << "lane " << i;
+            ASSERT_EQ(plain[i], valuesOf<T>(meansAround(lanes[i].near))) << "lane " << i;
+            ASSERT_EQ(plain[i], stated<T>(lanes[i], false)) << "lane " << i;
         }
     }
 }
 
-TEST(MosaicForms, InstancesAgreeOnBytes)
-{
-    for (const bool greenFirst : {false, true}) {
-        expectInstancesAgree<u8, false>(greenFirst);
-        expectInstancesAgree<u8, true>(greenFirst);
-    }
-}
-
-TEST(MosaicForms, InstancesAgreeOnWords)
-{
-    for (const bool greenFirst : {false, true}) {
-        expectInstancesAgree<u16, false>(greenFirst);
-        expectInstancesAgree<u16, true>(greenFirst);
-    }
-}
+TEST(MosaicForms, InstancesAgreeOnBytes) { expectInstancesAgree<u8>(); }
+TEST(MosaicForms, InstancesAgreeOnWords) { expectInstancesAgree<u16>(); }
 
 } // namespace
