@@ -7,6 +7,7 @@ root=$(dirname "$(dirname "$(realpath "${BASH_SOURCE[0]}")")")
 cd "$root" || exit
 jobs=$(nproc)
 buildPackages=(cmake ninja-build g++ libgtest-dev libbenchmark-dev libpng-dev libcli11-dev)
+testPackages=(abigail-tools dpkg-dev file make mandoc pkgconf) # what tests of the installed library run
 
 fail() {
     printf '%s: %s\n' "${0##*/}" "$*" >&2

@@ -1,6 +1,7 @@
 // The checks checked: they accept the reference itself, and reject functions that are wrong in one way each.
 #include "conformance/suites.hpp"
 #include "reference/reference.hpp"
+#include "support/called.hpp"
 
 #include <gtest/gtest.h>
 
@@ -142,19 +143,24 @@ PyxStatus roundsAsTheCaller(const u8* src, int srcStep, u8* dst, int dstStep, Ro
     return status;
 }
 
-template <class F> Subject c3(F* function)
+template <auto function> Subject ac4()
 {
-    return support::substitute("pyxiRGBToYCbCr_8u_C3R", reinterpret_cast<catalog::Function>(function));
+    return support::substitute("pyxiRGBToYCbCr_8u_AC4R", support::called<function>());
 }
 
-template <class F> Subject p3(F* function)
+template <auto function> Subject c3()
 {
-    return support::substitute("pyxiRGBToYCbCr_8u_P3R", reinterpret_cast<catalog::Function>(function));
+    return support::substitute("pyxiRGBToYCbCr_8u_C3R", support::called<function>());
+}
+
+template <auto function> Subject p3()
+{
+    return support::substitute("pyxiRGBToYCbCr_8u_P3R", support::called<function>());
 }
 
 TEST(Checker, AcceptsWhatIsRight)
 {
-    for (const Subject& subject : {c3(right), p3(reference::pyxiRGBToYCbCr_8u_P3R)}) {
+    for (const Subject& subject : {c3<right>(), p3<reference::pyxiRGBToYCbCr_8u_P3R>()}) {
         for (const auto check : {conformance::checkValues, conformance::checkGuards, conformance::checkFaults,
                                  conformance::checkRounding}) {
             EXPECT_EQ(check(subject).value_or(""), "");
@@ -164,37 +170,36 @@ TEST(Checker, AcceptsWhatIsRight)
 
 TEST(Checker, SeesWrongValues)
 {
-    EXPECT_TRUE(conformance::checkValues(c3(oneLevelOffAtOneWidth)));
-    EXPECT_TRUE(conformance::checkValues(c3(wrongWhenAligned)));
-    EXPECT_TRUE(conformance::checkValues(c3(writesBehindRows)));
-    EXPECT_TRUE(conformance::checkValues(c3(writesInFrontOfRows)));
-    EXPECT_TRUE(conformance::checkValues(c3(goesFromBottomToTop)));
-    EXPECT_TRUE(conformance::checkValues(c3(writesToTheSource)));
-    EXPECT_TRUE(conformance::checkValues(c3(warnsOfOddSizes)));
-    EXPECT_TRUE(conformance::checkValues(
-        support::substitute("pyxiRGBToYCbCr_8u_AC4R", reinterpret_cast<catalog::Function>(setsTheFourthSample))));
+    EXPECT_TRUE(conformance::checkValues(c3<oneLevelOffAtOneWidth>()));
+    EXPECT_TRUE(conformance::checkValues(c3<wrongWhenAligned>()));
+    EXPECT_TRUE(conformance::checkValues(c3<writesBehindRows>()));
+    EXPECT_TRUE(conformance::checkValues(c3<writesInFrontOfRows>()));
+    EXPECT_TRUE(conformance::checkValues(c3<goesFromBottomToTop>()));
+    EXPECT_TRUE(conformance::checkValues(c3<writesToTheSource>()));
+    EXPECT_TRUE(conformance::checkValues(c3<warnsOfOddSizes>()));
+    EXPECT_TRUE(conformance::checkValues(ac4<setsTheFourthSample>()));
 }
 
 TEST(CheckerDeathTest, SeesStrayAccesses)
 {
-    EXPECT_DEATH(conformance::checkGuards(c3(readsBehindTheSource)), "memory was touched");
-    EXPECT_DEATH(conformance::checkGuards(c3(readsInFrontOfTheSource)), "memory was touched");
-    EXPECT_DEATH(conformance::checkGuards(c3(rewritesWhatFollowsTheTarget)), "memory was touched");
+    EXPECT_DEATH(conformance::checkGuards(c3<readsBehindTheSource>()), "memory was touched");
+    EXPECT_DEATH(conformance::checkGuards(c3<readsInFrontOfTheSource>()), "memory was touched");
+    EXPECT_DEATH(conformance::checkGuards(c3<rewritesWhatFollowsTheTarget>()), "memory was touched");
 }
 
 TEST(Checker, SeesWrongStatuses)
 {
-    EXPECT_TRUE(conformance::checkFaults(c3(writesBeforeItTestsTheSize)));
-    EXPECT_TRUE(conformance::checkFaults(c3(testsTheSizeFirst)));
-    EXPECT_TRUE(conformance::checkFaults(c3(acceptsNoRows)));
-    EXPECT_TRUE(conformance::checkFaults(p3(testsTheElementsFirst)));
-    EXPECT_TRUE(conformance::checkFaults(p3(ignoresAnElement)));
+    EXPECT_TRUE(conformance::checkFaults(c3<writesBeforeItTestsTheSize>()));
+    EXPECT_TRUE(conformance::checkFaults(c3<testsTheSizeFirst>()));
+    EXPECT_TRUE(conformance::checkFaults(c3<acceptsNoRows>()));
+    EXPECT_TRUE(conformance::checkFaults(p3<testsTheElementsFirst>()));
+    EXPECT_TRUE(conformance::checkFaults(p3<ignoresAnElement>()));
 }
 
 TEST(Checker, SeesTheRoundingMode)
 {
-    EXPECT_TRUE(conformance::checkRounding(c3(leavesItsOwnMode)));
-    EXPECT_TRUE(conformance::checkRounding(c3(roundsAsTheCaller)));
+    EXPECT_TRUE(conformance::checkRounding(c3<leavesItsOwnMode>()));
+    EXPECT_TRUE(conformance::checkRounding(c3<roundsAsTheCaller>()));
 }
 
 } // namespace

@@ -253,7 +253,8 @@ std::optional<std::string> Scene::sourceDamage() const
             for (std::size_t k = 0; k < list.size(); ++k) copyRows(pristineLists_[i][k], list[k]);
         }
         if (const auto text = support::firstDifference(pristineLists_[i], list)) {
-            return "parameter " + std::to_string(i) + " changed: " + *text;
+            std::string what = "parameter ";
+            return what.append(std::to_string(i)).append(" changed: ").append(*text);
         }
     }
     return std::nullopt;

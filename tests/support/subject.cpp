@@ -1,6 +1,7 @@
 #include "support/subject.hpp"
 
 #include "reference/reference.hpp"
+#include "support/called.hpp"
 
 #include <algorithm>
 #include <stdexcept>
@@ -14,7 +15,7 @@ namespace
 {
 
 #define EXPORT(name, ...)                                                                                              \
-    static_assert(std::is_same_v<decltype(&::name), decltype(&reference::name)>,                                       \
+    static_assert(std::is_same_v<decltype(&::name), decltype(&Called<&reference::name>::call)>,                        \
                   "the reference of " #name " has another signature");
 #include "exports.def"
 #undef EXPORT
@@ -22,7 +23,7 @@ namespace
 std::vector<catalog::Function> references()
 {
     return {
-#define EXPORT(name, ...) reinterpret_cast<catalog::Function>(&reference::name),
+#define EXPORT(name, ...) called<&reference::name>(),
 #include "exports.def"
 #undef EXPORT
     };

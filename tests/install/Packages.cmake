@@ -1,0 +1,61 @@
+# Makes Debian packages, and looks at what they hold and need.
+cmake_minimum_required(VERSION 3.25)
+include(${SETTINGS})
+
+set(folder ${work}/packages)
+file(REMOVE_RECURSE ${folder})
+run(${CMAKE_CPACK_COMMAND} -G DEB --config ${build}/CPackConfig.cmake -B ${folder})
+
+# holds(<package> <packages that it needs> <file>...): unpacks it and demands the files, and no others outside of
+# share/doc and include.
+function(holds package needs)
+  file(GLOB archive ${folder}/${package}_*.deb)
+  run(dpkg-deb --extract ${archive} ${folder}/${package})
+  file(GLOB_RECURSE found RELATIVE ${folder}/${package}/usr ${folder}/${package}/*)
+  list(FILTER found EXCLUDE REGEX "^${includeDir}/pyxcc/")
+  set(expected ${ARGN} share/doc/${package}/copyright share/doc/${package}/changelog.Debian.gz)
+  list(SORT found)
+  list(SORT expected)
+  if(NOT found STREQUAL expected)
+    message(SEND_ERROR "${package} holds ${found}\ninstead of ${expected}")
+  endif()
+  run(dpkg-deb --field ${archive} Depends)
+  foreach(need IN LISTS needs)
+    if(NOT output MATCHES "(^|, )${need}( |,|\n|$)")
+      message(SEND_ERROR "${package} does not depend on ${need}: ${output}")
+    endif()
+  endforeach()
+endfunction()
+
+set(core libpyxcore${major})
+set(library libpyxccq7-${major})
+holds(${core} "libc6" ${libraryDir}/libpyxcore.so.${major} ${libraryDir}/libpyxcore.so.${version})
+holds(${library} "${core};libc6;libstdc..6" ${libraryDir}/libpyxccq7.so.${major} ${libraryDir}/libpyxccq7.so.${version})
+holds(libpyxcc-dev "${core};${library}"
+      ${libraryDir}/libpyxccq7.so ${libraryDir}/libpyxcore.so ${libraryDir}/pkgconfig/pyxcc.pc
+      ${libraryDir}/cmake/pyxcc/pyxcc-config-version.cmake ${libraryDir}/cmake/pyxcc/pyxcc-config.cmake
+      ${libraryDir}/cmake/pyxcc/pyxcc-targets-release.cmake ${libraryDir}/cmake/pyxcc/pyxcc-targets.cmake)
+set(packages ${core} ${library} libpyxcc-dev)
+if(HAS_TOOL)
+  holds(pyxcc "${library};libpng16-16" bin/pyxcc share/man/man1/pyxcc.1.gz)
+  list(APPEND packages pyxcc)
+endif()
+
+# All of them in one place, as they would be installed.
+set(root ${folder}/root)
+file(GLOB archives ${folder}/*.deb)
+list(LENGTH archives count)
+list(LENGTH packages expectedCount)
+if(NOT count EQUAL expectedCount)
+  message(SEND_ERROR "there are other packages than ${packages}: ${archives}")
+endif()
+foreach(archive IN LISTS archives)
+  run(dpkg-deb --extract ${archive} ${root})
+endforeach()
+if(HAS_TOOL)
+  set(ENV{LD_LIBRARY_PATH} ${root}/usr/${libraryDir})
+  run(${root}/usr/bin/pyxcc list)
+  if(NOT output MATCHES "\n520 exports\n$")
+    message(SEND_ERROR "the packaged tool lists:\n${output}")
+  endif()
+endif()
