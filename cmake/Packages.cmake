@@ -1,4 +1,9 @@
-# `cpack -G DEB` makes a package each of the two libraries, of what one needs to build with them, and of the tool.
+# `cpack -G DEB` makes a package each of the two libraries, of what one needs to build with them, and of the tool. Not of
+# 32-bit libraries on a 64-bit machine: they would need what that machine's packages of 32-bit libraries are called.
+if(CMAKE_SIZEOF_VOID_P EQUAL 4 AND CMAKE_SYSTEM_PROCESSOR STREQUAL "x86_64")
+  return()
+endif()
+
 set(CPACK_PACKAGE_NAME pyxcc)
 set(CPACK_PACKAGE_VERSION ${PROJECT_VERSION})
 set(CPACK_PACKAGE_VENDOR pyxcc)
@@ -19,9 +24,6 @@ set(CPACK_DEBIAN_PACKAGE_CONTROL_STRICT_PERMISSION ON)
 set(CPACK_DEBIAN_PACKAGE_PRIORITY optional)
 set(CPACK_DEBIAN_PACKAGE_GENERATE_SHLIBS ON)
 set(CPACK_DEBIAN_PACKAGE_GENERATE_SHLIBS_POLICY ">=")
-if(CMAKE_SIZEOF_VOID_P EQUAL 4)
-  set(CPACK_DEBIAN_PACKAGE_ARCHITECTURE i386)
-endif()
 set(CPACK_INSTALL_DEFAULT_DIRECTORY_PERMISSIONS OWNER_READ OWNER_WRITE OWNER_EXECUTE GROUP_READ GROUP_EXECUTE WORLD_READ
                                                 WORLD_EXECUTE)
 
