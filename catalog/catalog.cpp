@@ -40,7 +40,8 @@ template <class T> constexpr ParameterType parameterType()
 template <class... A> void readSignature(Export& entry)
 {
     // A number behind a step is a parameter.
-    const auto read = [&entry, side = &entry.source, afterRoi = false]<class T>(std::type_identity<T>) mutable {
+    const auto read = [&entry, side = &entry.source, afterRoi = false](auto type) mutable {
+        using T = typename decltype(type)::type;
         if constexpr (std::is_same_v<T, RoiRect>) {
             entry.mosaic = true;
         } else if constexpr (std::is_same_v<T, RoiSize>) {

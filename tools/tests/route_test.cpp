@@ -82,7 +82,7 @@ TEST(Route, ChangesTheDepthOfRgbButNotOfOtherModels)
 TEST(Route, DoesNotLoseTheColoursOnTheWay)
 {
     const End gray = {"Gray", "C1"}, packed = {"RGB565", "C3", Element::u16};
-    const auto through = [](End middle) {
+    const auto through = [](const End& middle) {
         return way({conversion("a", {"RGB", "C3"}, middle), conversion("b", middle, yccC3)}, rgb(), format(yccC3));
     };
     EXPECT_EQ(through(gray), "no way");

@@ -135,7 +135,7 @@ namespace detail
 /// Whether half the weight, rounded down, gives the rounded products of a sample: what is lost shows nowhere.
 template <int Zero, int Weight>
 constexpr bool halfServes = [] {
-    for (int x = -Zero; x < 256 - Zero; ++x) {
+    for (int x = -Zero; x != 256 - Zero; ++x) {
         if ((x * (Weight >> 1) + 0x4000) >> 15 != (x * Weight + 0x8000) >> 16) return false;
     }
     return true;

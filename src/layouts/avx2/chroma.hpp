@@ -123,7 +123,7 @@ namespace detail
 template <int Columns, Order order>
 constexpr Places chromaPlaces = [] {
     Places places{};
-    for (int i = 0; i < wide::U8::count / Columns; ++i) {
+    for (int i = 0; i != wide::U8::count / Columns; ++i) {
         const int column = i * Columns, four = column / 4;
         const int four8 = order == Order::ofMemory ? four : four / 2 + four % 2 * 4; // 8 fours in 16 bytes
         places[i] = static_cast<u8>(2 * four8 + column % 4 / 2);
