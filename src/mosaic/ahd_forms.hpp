@@ -6,7 +6,11 @@
 
 #include "pyxcc/types.h"
 
-#include <cstdlib>
+#include <algorithm>
+#include <array>
+#include <bit>
+#include <cstdint>
+#include <cstring>
 #include <limits>
 #include <type_traits>
 
@@ -38,10 +42,18 @@ template <class Number> Number greenBetween(Number before, Number behind, Number
     return atMost > least ? atMost : least;
 }
 
-/// All bits where the column is green.
-template <class Number> Number greenMask(int x, GreenParity green)
+/// A mask for every other column, from the second one on.
+template <class Number, int Columns>
+constexpr std::array<Number, Columns> everyOtherColumn = [] {
+    std::array<Number, Columns> masks{};
+    for (int x = 1; x < Columns; x += 2) masks[x] = -1;
+    return masks;
+}();
+
+/// All bits where the column is green: a load for each register, where parities take several steps.
+template <class Number, int Columns> const Number* greenMasks(GreenParity green)
 {
-    return static_cast<Number>(-static_cast<Number>((x & 1) == green));
+    return everyOtherColumn<Number, Columns + 1>.data() + (1 - green);
 }
 
 template <class Number> Number where(Number mask, Number yes, Number no)
@@ -58,44 +70,48 @@ template <class T> T saturated(NumberFor<T> value)
 
 } // namespace detail
 
-/// Green along the row and along the column. `rows` are five, [2] is the row itself.
-template <class T>
+/// Green along the row and along the column. `rows` are five, [2] is the row itself. `count` is no more than `Columns`.
+template <int Columns, class T>
 void interpolateGreen(const T* const rows[5], T* __restrict alongRow, T* __restrict alongColumn, int count,
                       GreenParity green)
 {
     const T *const up2 = rows[0], *const up = rows[1], *const at = rows[2], *const down = rows[3],
                    *const down2 = rows[4];
     using Number = NumberFor<T>;
+    const Number* const masks = detail::greenMasks<Number, Columns>(green);
     for (int x = 0; x < count; ++x) {
         const Number own = at[x];
         const Number h = detail::greenBetween<Number>(at[x - 1], at[x + 1], own, at[x - 2], at[x + 2]);
         const Number v = detail::greenBetween<Number>(up[x], down[x], own, up2[x], down2[x]);
-        const auto atGreen = detail::greenMask<Number>(x, green);
-        alongRow[x] = static_cast<T>(detail::where(atGreen, own, h));
-        alongColumn[x] = static_cast<T>(detail::where(atGreen, own, v));
+        alongRow[x] = static_cast<T>(detail::where(masks[x], own, h));
+        alongColumn[x] = static_cast<T>(detail::where(masks[x], own, v));
     }
 }
 
-/// The colour that a row has besides green, and the one that it has not, by what they differ from green around.
-template <class T>
+/// The colour that a row has besides green, and the one that it has not, by what they differ from green around. `count`
+/// is no more than `Columns`.
+template <int Columns, class T>
 void interpolateColors(const ThreeRows<T>& mosaic, const ThreeRows<T>& greens, T* __restrict ofRow,
                        T* __restrict ofOthers, int count, GreenParity green)
 {
-    const T *const e0 = mosaic.row[0], *const e1 = mosaic.row[1], *const e2 = mosaic.row[2];
-    const T *const g0 = greens.row[0], *const g1 = greens.row[1], *const g2 = greens.row[2];
     using Number = NumberFor<T>;
+    const Number* const masks = detail::greenMasks<Number, Columns>(green);
+    alignas(32) Number beside[Columns + 2], across[Columns + 2]; // from one column in front of the first
+    const T *const e0 = mosaic.row[0] - 1, *const e1 = mosaic.row[1] - 1, *const e2 = mosaic.row[2] - 1;
+    const T *const g0 = greens.row[0] - 1, *const g1 = greens.row[1] - 1, *const g2 = greens.row[2] - 1;
+    for (int x = 0; x < count + 2; ++x) {
+        beside[x] = static_cast<Number>(e1[x] - g1[x]);
+        across[x] = static_cast<Number>((e0[x] - g0[x]) + (e2[x] - g2[x]));
+    }
     for (int x = 0; x < count; ++x) {
-        const auto h = static_cast<Number>((e1[x - 1] - g1[x - 1]) + (e1[x + 1] - g1[x + 1]));
-        const auto v = static_cast<Number>((e0[x] - g0[x]) + (e2[x] - g2[x]));
-        const auto before = static_cast<Number>((e0[x - 1] - g0[x - 1]) + (e2[x - 1] - g2[x - 1]));
-        const auto behind = static_cast<Number>((e0[x + 1] - g0[x + 1]) + (e2[x + 1] - g2[x + 1]));
-        const auto d = static_cast<Number>(before + behind);
-        const auto atGreen = detail::greenMask<Number>(x, green);
-        const Number at = e1[x], greenAt = g1[x];
-        const auto besides = static_cast<Number>(greenAt + (h >> 1));
-        const auto across = static_cast<Number>(v >> 1), diagonal = static_cast<Number>(d >> 2);
-        ofRow[x] = detail::saturated<T>(detail::where(atGreen, besides, at));
-        ofOthers[x] = detail::saturated<T>(static_cast<Number>(greenAt + detail::where(atGreen, across, diagonal)));
+        const auto h = static_cast<Number>(beside[x] + beside[x + 2]), v = across[x + 1];
+        const auto d = static_cast<Number>(across[x] + across[x + 2]);
+        const Number at = e1[x + 1], greenAt = g1[x + 1];
+        const auto ofGreen = static_cast<Number>(greenAt + (h >> 1));
+        const auto acrossGreen = static_cast<Number>(v >> 1), diagonal = static_cast<Number>(d >> 2);
+        ofRow[x] = detail::saturated<T>(detail::where(masks[x], ofGreen, at));
+        ofOthers[x] =
+            detail::saturated<T>(static_cast<Number>(greenAt + detail::where(masks[x], acrossGreen, diagonal)));
     }
 }
 
@@ -105,122 +121,139 @@ template <class T, int Columns> struct LumaChroma {
     alignas(32) Number y[Columns], cb[Columns], cr[Columns];
 };
 
+/// (66 R + 129 G + 25 B + 128) >> 8 and so on, by what red and blue have more than green: that takes fewer products.
+/// The weights of chroma add up to nothing. 16 bits hold the sums for bytes: that for luma without a sign, those for
+/// chroma with one.
 template <class T, int Columns>
 void toLumaChroma(const T* red, const T* green, const T* blue, LumaChroma<T, Columns>& to, int count)
 {
     using Number = typename LumaChroma<T, Columns>::Number;
+    using Luma = std::make_unsigned_t<Number>;
     Number* __restrict const toY = to.y;
     Number* __restrict const toCb = to.cb;
     Number* __restrict const toCr = to.cr;
     for (int x = 0; x < count; ++x) {
-        const s32 r = red[x], g = green[x], b = blue[x];
-        toY[x] = static_cast<Number>((66 * r + 129 * g + 25 * b + 128) >> 8);
-        toCb[x] = static_cast<Number>((-38 * r - 74 * g + 112 * b + 128) >> 8);
-        toCr[x] = static_cast<Number>((112 * r - 94 * g - 18 * b + 128) >> 8);
+        const Number g = green[x];
+        const auto r = static_cast<Number>(red[x] - g), b = static_cast<Number>(blue[x] - g);
+        toY[x] = static_cast<Number>(static_cast<Luma>(220 * g + 66 * r + 25 * b + 128) >> 8);
+        toCb[x] = static_cast<Number>(static_cast<Number>(112 * b - 38 * r + 128) >> 8);
+        toCr[x] = static_cast<Number>(static_cast<Number>(112 * r - 18 * b + 128) >> 8);
     }
 }
 
-namespace detail
-{
+/// A sum of two squares of chroma. Those of bytes are below 65536: the largest is that of green and magenta. Those of
+/// 16-bit samples may leave 32 bits, and wrap.
+template <class T> using SquaresFor = std::conditional_t<sizeof(T) == 1, u16, s32>;
 
-struct Distance {
-    s32 luma, chroma;
+/// How far samples are from their neighbours.
+template <class T, int Columns> struct Distances {
+    alignas(32) NumberFor<T> luma[Columns];
+    alignas(32) SquaresFor<T> chroma[Columns];
 };
 
-/// A row of luma and chroma as pointers, which the compiler can tell from what is written.
-template <class Number> struct Row {
-    const Number* __restrict y, * __restrict cb, * __restrict cr;
-
-    template <class LumaChroma> explicit Row(const LumaChroma& of) : y(of.y), cb(of.cb), cr(of.cr) {}
-};
-
-/// The squares of 16-bit chroma may leave 32 bits, and the sum wraps.
-inline s32 square(s16 x) { return x * x; }
-inline u32 square(s32 x) { return static_cast<u32>(x) * static_cast<u32>(x); }
-
-/// Differences are no wider than the numbers.
-template <class Number> Distance between(const Row<Number>& a, int i, const Row<Number>& b, int k)
-{
-    const auto y = static_cast<Number>(a.y[i] - b.y[k]);
-    const auto cb = static_cast<Number>(a.cb[i] - b.cb[k]), cr = static_cast<Number>(a.cr[i] - b.cr[k]);
-    return {std::abs(y), static_cast<s32>(square(cb) + square(cr))};
-}
-
-inline s32 larger(s32 a, s32 b) { return a > b ? a : b; }
-inline s32 smaller(s32 a, s32 b) { return a < b ? a : b; }
-inline Distance larger(Distance a, Distance b) { return {larger(a.luma, b.luma), larger(a.chroma, b.chroma)}; }
-inline Distance smaller(Distance a, Distance b) { return {smaller(a.luma, b.luma), smaller(a.chroma, b.chroma)}; }
-
-inline s32 isWithin(Distance distance, Distance limit)
-{
-    return static_cast<s32>(distance.luma <= limit.luma) & static_cast<s32>(distance.chroma <= limit.chroma);
-}
-
-/// How far a candidate is from those around it.
-struct Around {
-    Distance left, right, up, down;
-
-    template <class Row>
-    Around(const Row& upper, const Row& middle, const Row& lower, int x)
-        : left(between(middle, x - 1, middle, x)), right(between(middle, x + 1, middle, x)),
-          up(between(upper, x, middle, x)), down(between(lower, x, middle, x))
-    {
-    }
-
-    s32 countWithin(Distance limit) const
-    {
-        return isWithin(left, limit) + isWithin(right, limit) + isWithin(up, limit) + isWithin(down, limit);
-    }
-};
-
-} // namespace detail
-
-/// What is added to scores, so that they fit samples.
-inline constexpr s32 noScore = 4;
-
-/// How many more of its neighbours the candidate along the row resembles than the one along the column. The column in
-/// front of the first is at index 0.
+/// Between the samples from column `i` of one row on and those from column `k` of another.
 template <class T, int Columns>
-void scoreCandidates(const LumaChroma<T, Columns> alongRow[3], const LumaChroma<T, Columns> alongColumn[3],
-                     T* __restrict scores, int count)
+void measure(const LumaChroma<T, Columns>& a, int i, const LumaChroma<T, Columns>& b, int k, Distances<T, Columns>& to,
+             int count)
 {
-    using Row = detail::Row<typename LumaChroma<T, Columns>::Number>;
-    const Row h0(alongRow[0]), h1(alongRow[1]), h2(alongRow[2]);
-    const Row v0(alongColumn[0]), v1(alongColumn[1]), v2(alongColumn[2]);
+    using Number = NumberFor<T>;
+    const Number *const ay = a.y + i, *const acb = a.cb + i, *const acr = a.cr + i;
+    const Number *const by = b.y + k, *const bcb = b.cb + k, *const bcr = b.cr + k;
+    NumberFor<T>* __restrict const luma = to.luma;
+    SquaresFor<T>* __restrict const chroma = to.chroma;
     for (int x = 0; x < count; ++x) {
-        const detail::Around h(h0, h1, h2, x + 1), v(v0, v1, v2, x + 1);
-        const detail::Distance limit = smaller(larger(h.left, h.right), larger(v.up, v.down));
-        scores[x] = static_cast<T>(h.countWithin(limit) - v.countWithin(limit) + noScore);
+        const auto y = static_cast<Number>(ay[x] - by[x]);
+        luma[x] = static_cast<Number>(y < 0 ? -y : y);
+        const auto cb = static_cast<u32>(static_cast<Number>(acb[x] - bcb[x]));
+        const auto cr = static_cast<u32>(static_cast<Number>(acr[x] - bcr[x]));
+        chroma[x] = static_cast<SquaresFor<T>>(cb * cb + cr * cr);
     }
 }
 
-/// Sums of three by three scores.
-template <class T> void sumScores(const ThreeRows<T>& scores, s32* __restrict sums, int count)
+/// Those of a row of a candidate: along the row, those at x are between the columns x - 1 and x; then to the rows above
+/// and below.
+template <class T, int Columns> struct DistancesAround {
+    const Distances<T, Columns>*beside, *above, *below;
+};
+
+/// What is added to scores, so that they have no sign.
+inline constexpr int noScore = 4;
+
+/// How many more of its neighbours the candidate along the row resembles than the one along the column.
+template <class T, int Columns>
+void scoreCandidates(const DistancesAround<T, Columns>& h, const DistancesAround<T, Columns>& v, u8* __restrict scores,
+                     int count)
 {
-    const T *const s0 = scores.row[0], *const s1 = scores.row[1], *const s2 = scores.row[2];
+    using Luma = NumberFor<T>;
+    using Chroma = SquaresFor<T>;
+    const Luma *const hBeside = h.beside->luma, *const hAbove = h.above->luma, *const hBelow = h.below->luma;
+    const Luma *const vBeside = v.beside->luma, *const vAbove = v.above->luma, *const vBelow = v.below->luma;
+    const Chroma *const hBesideC = h.beside->chroma, *const hAboveC = h.above->chroma, *const hBelowC = h.below->chroma;
+    const Chroma *const vBesideC = v.beside->chroma, *const vAboveC = v.above->chroma, *const vBelowC = v.below->chroma;
     for (int x = 0; x < count; ++x) {
-        const s32 before = s0[x - 1] + s1[x - 1] + s2[x - 1], behind = s0[x + 1] + s1[x + 1] + s2[x + 1];
-        sums[x] = before + (s0[x] + s1[x] + s2[x]) + behind - 9 * noScore;
+        const Luma limit = std::min(std::max(hBeside[x], hBeside[x + 1]), std::max(vAbove[x], vBelow[x]));
+        const Chroma limitC = std::min(std::max(hBesideC[x], hBesideC[x + 1]), std::max(vAboveC[x], vBelowC[x]));
+        const auto isWithin = [&](Luma luma, Chroma chroma) {
+            return static_cast<Luma>(static_cast<Luma>(luma <= limit) & static_cast<Luma>(chroma <= limitC));
+        };
+        const auto alongRow =
+            static_cast<Luma>(isWithin(hBeside[x], hBesideC[x]) + isWithin(hBeside[x + 1], hBesideC[x + 1]) +
+                              isWithin(hAbove[x], hAboveC[x]) + isWithin(hBelow[x], hBelowC[x]));
+        const auto alongColumn =
+            static_cast<Luma>(isWithin(vBeside[x], vBesideC[x]) + isWithin(vBeside[x + 1], vBesideC[x + 1]) +
+                              isWithin(vAbove[x], vAboveC[x]) + isWithin(vBelow[x], vBelowC[x]));
+        scores[x] = static_cast<u8>(alongRow - alongColumn + noScore);
     }
 }
 
-/// Turns sums into masks of where to take the candidate along the column. A sum of zero follows the one in front of it.
-/// Returns the last that was not zero.
-inline s32 decide(s32* sums, int count, s32 last)
+/// Masks of places where the sum of three by three scores is below zero, and of those where it is zero.
+template <int Columns> struct Signs {
+    alignas(32) u8 negative[Columns], zero[Columns];
+};
+
+template <int Columns> void addScores(const ThreeRows<u8>& scores, Signs<Columns>& signs, int count)
 {
+    static_assert(9 * 2 * noScore < 256);
+    constexpr int none = 9 * noScore;
+    alignas(32) u8 columns[Columns + 2];
+    const u8 *const s0 = scores.row[0] - 1, *const s1 = scores.row[1] - 1, *const s2 = scores.row[2] - 1;
+    for (int x = 0; x < count + 2; ++x) columns[x] = static_cast<u8>(s0[x] + s1[x] + s2[x]);
     for (int x = 0; x < count; ++x) {
-        const s32 sum = sums[x];
-        last = sum != 0 ? sum : last;
-        sums[x] = last >> 31;
+        const auto sum = static_cast<u8>(columns[x] + columns[x + 1] + columns[x + 2]);
+        signs.negative[x] = sum < none ? 0xff : 0;
+        signs.zero[x] = sum == none ? 0xff : 0;
+    }
+}
+
+/// Turns the masks of negative sums into those of where to take the candidate along the column, for whole eights of
+/// columns. A sum of zero follows the one in front of it; `last` is 255 if the one in front of the first is negative,
+/// otherwise 0. Returns the same for the last column.
+///
+/// Eight masks make a number, the first column its lowest byte. Where a run of zeros begins behind a negative sum,
+/// adding 1 to its first byte carries through all of the run, and no further.
+template <int Columns> std::uint64_t decide(Signs<Columns>& signs, int count, std::uint64_t last)
+{
+    static_assert(std::endian::native == std::endian::little);
+    constexpr std::uint64_t ones = 0x0101010101010101;
+    for (int x = 0; x < count; x += 8) {
+        std::uint64_t negative, zero;
+        std::memcpy(&negative, signs.negative + x, 8);
+        std::memcpy(&zero, signs.zero + x, 8);
+        const std::uint64_t behindNegative = (negative << 8 | last) & zero & ones;
+        negative |= zero & ~(zero + behindNegative);
+        std::memcpy(signs.negative + x, &negative, 8);
+        last = negative >> 56;
     }
     return last;
 }
 
 template <class T>
-void choose(const s32* __restrict masks, const T* alongRow, const T* alongColumn, T* __restrict chosen, int count)
+void choose(const u8* __restrict masks, const T* alongRow, const T* alongColumn, T* __restrict chosen, int count)
 {
-    for (int x = 0; x < count; ++x)
-        chosen[x] = static_cast<T>(detail::where<s32>(masks[x], alongColumn[x], alongRow[x]));
+    for (int x = 0; x < count; ++x) {
+        const auto mask = static_cast<T>(static_cast<s8>(masks[x]));
+        chosen[x] = detail::where<T>(mask, alongColumn[x], alongRow[x]);
+    }
 }
 
 } // namespace pyxcc::mosaic

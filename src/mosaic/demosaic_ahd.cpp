@@ -16,9 +16,6 @@ using namespace pyxcc::mosaic;
 namespace
 {
 
-/// Columns that are worked on at a time, so that what a step of the work takes and makes stays near at hand.
-constexpr int stretch = 256;
-
 /// What a call works on. Blocks of the target lie relative to (left, top).
 template <class T> struct Work {
     ExtendedMosaic<T> mosaic;
@@ -51,13 +48,13 @@ template <class T> struct Planes {
         Ring<T, 5> green;
     };
     Candidate alongRow, alongColumn;
-    Ring<T, 4> score;
+    Ring<u8, 4> score;
 
     Planes(T* workspace, std::ptrdiff_t step)
     {
         int rows = 0;
-        const auto take = [&]<int Rows>(Ring<T, Rows>& ring) {
-            ring = {reinterpret_cast<T*>(rowAt(bytes(workspace), step, rows)), step};
+        const auto take = [&]<class Sample, int Rows>(Ring<Sample, Rows>& ring) {
+            ring = {reinterpret_cast<Sample*>(rowAt(bytes(workspace), step, rows)), step};
             rows += Rows;
         };
         for (Candidate* candidate : {&alongRow, &alongColumn}) {
@@ -96,6 +93,9 @@ public:
     }
 
 private:
+    /// Columns that are worked on at a time, so that what a step of the work takes and makes stays near at hand.
+    static constexpr int stretch = 256 / static_cast<int>(sizeof(T));
+
     /// Calls with each stretch of columns [from, to) of the planes.
     template <class Step> static void eachStretch(int from, int to, const Step& step)
     {
@@ -115,8 +115,8 @@ private:
             for (int i = 0; i < 5; ++i) {
                 rows[i] = work_.mosaic.samples(y + i - 2, place(column) - 2, place(column) + count + 2, buffers[i]) + 2;
             }
-            interpolateGreen(rows, planes_.alongRow.green.row(y) + column, planes_.alongColumn.green.row(y) + column,
-                             count, greenParity(y, column));
+            interpolateGreen<stretch>(rows, planes_.alongRow.green.row(y) + column,
+                                      planes_.alongColumn.green.row(y) + column, count, greenParity(y, column));
         });
     }
 
@@ -133,24 +133,42 @@ private:
             for (const auto* candidate : {&planes_.alongRow, &planes_.alongColumn}) {
                 T* const red = candidate->red.row(y) + column;
                 T* const blue = candidate->blue.row(y) + column;
-                interpolateColors(mosaic, candidate->green.around(y, column), redRow ? red : blue, redRow ? blue : red,
-                                  count, greenParity(y, column));
+                interpolateColors<stretch>(mosaic, candidate->green.around(y, column), redRow ? red : blue,
+                                           redRow ? blue : red, count, greenParity(y, column));
             }
         });
     }
 
+    /// The distances of rows of a candidate from each other and along each of those within.
+    struct Measured {
+        Distances<T, stretch + 2> between[3], beside[2];
+
+        DistancesAround<T, stretch + 2> around(int row) const
+        {
+            return {&beside[row], &between[row], &between[row + 1]};
+        }
+    };
+
     void fillScores(s32 y, int rows) const
     {
         eachStretch(2, width_ + 4, [&](int column, int count) {
-            LumaChroma<T, stretch + 2> alongRow[4], alongColumn[4];
-            for (int i = 0; i < rows + 2; ++i) {
-                convertCandidate(planes_.alongRow, y + i - 1, column - 1, alongRow[i], count + 2);
-                convertCandidate(planes_.alongColumn, y + i - 1, column - 1, alongColumn[i], count + 2);
-            }
+            Measured alongRow, alongColumn;
+            measureCandidate(planes_.alongRow, y, rows, column, alongRow, count);
+            measureCandidate(planes_.alongColumn, y, rows, column, alongColumn, count);
             for (int i = 0; i < rows; ++i) {
-                scoreCandidates(alongRow + i, alongColumn + i, planes_.score.row(y + i) + column, count);
+                scoreCandidates(alongRow.around(i), alongColumn.around(i), planes_.score.row(y + i) + column, count);
             }
         });
+    }
+
+    /// The column in front of the first is at index 0 of luma and chroma.
+    static void measureCandidate(const typename Planes<T>::Candidate& candidate, s32 y, int rows, int column,
+                                 Measured& to, int count)
+    {
+        LumaChroma<T, stretch + 2> converted[4];
+        for (int i = 0; i < rows + 2; ++i) convertCandidate(candidate, y + i - 1, column - 1, converted[i], count + 2);
+        for (int i = 0; i < rows + 1; ++i) measure(converted[i], 1, converted[i + 1], 1, to.between[i], count);
+        for (int i = 0; i < rows; ++i) measure(converted[i + 1], 0, converted[i + 1], 1, to.beside[i], count + 1);
     }
 
     static void convertCandidate(const typename Planes<T>::Candidate& candidate, s32 y, int column,
@@ -162,15 +180,15 @@ private:
 
     void emit(s32 y) const
     {
-        s32 last = 1;
+        std::uint64_t last = 0;
         u8* const target = targetRow(y);
         eachStretch(3, width_ + 3, [&](int column, int count) {
-            s32 masks[stretch];
-            sumScores(planes_.score.around(y, column), masks, count);
-            last = decide(masks, count, last);
+            Signs<stretch> signs = {}; // whole eights are decided
+            addScores(planes_.score.around(y, column), signs, count);
+            last = decide(signs, count, last);
             T chosen[3][stretch];
             const auto chooseFrom = [&](const auto& alongRow, const auto& alongColumn, T* to) {
-                choose(masks, alongRow.row(y) + column, alongColumn.row(y) + column, to, count);
+                choose(signs.negative, alongRow.row(y) + column, alongColumn.row(y) + column, to, count);
             };
             chooseFrom(planes_.alongRow.red, planes_.alongColumn.red, chosen[0]);
             chooseFrom(planes_.alongRow.green, planes_.alongColumn.green, chosen[1]);

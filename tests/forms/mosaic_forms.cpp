@@ -1,12 +1,15 @@
-// Means of the samples around a place of a mosaic: vector instances against scalar ones, and both against plain
+// What is made of the samples around a place of a mosaic: vector instances against scalar ones, and both against plain
 // numbers.
 #include "every_input.hpp"
 
+#include "mosaic/ahd_forms.hpp"
 #include "mosaic/cfa_forms.hpp"
 
+#include <algorithm>
 #include <cstdlib>
 #include <random>
 #include <type_traits>
+#include <vector>
 
 namespace
 {
@@ -134,5 +137,102 @@ template <class T> void expectInstancesAgree()
 
 TEST(MosaicForms, InstancesAgreeOnBytes) { expectInstancesAgree<u8>(); }
 TEST(MosaicForms, InstancesAgreeOnWords) { expectInstancesAgree<u16>(); }
+
+/// The largest sum of two squares lies between two of the outermost colours of each blue chroma.
+TEST(Homogeneity, SquaresOfTheChromaOfBytesFit16Bits)
+{
+    constexpr int zero = 128, values = 256;
+    std::array<int, values> least, most;
+    least.fill(1000), most.fill(-1000);
+    for (int r = 0; r < 256; ++r) {
+        for (int g = 0; g < 256; ++g) {
+            for (int b = 0; b < 256; ++b) {
+                const int cb = zero + ((-38 * r - 74 * g + 112 * b + 128) >> 8);
+                const int cr = (112 * r - 94 * g - 18 * b + 128) >> 8;
+                least[cb] = std::min(least[cb], cr), most[cb] = std::max(most[cb], cr);
+            }
+        }
+    }
+    int largest = 0;
+    for (int i = 0; i < values; ++i) {
+        for (int k = 0; k < values; ++k) {
+            if (most[i] < least[i] || most[k] < least[k]) continue;
+            const int cr = std::max(most[i] - least[k], most[k] - least[i]);
+            largest = std::max(largest, (i - k) * (i - k) + cr * cr);
+        }
+    }
+    EXPECT_GT(largest, 32767); // but only without a sign
+    EXPECT_LT(largest, 65536);
+}
+
+/// Luma and chroma by differences against their weights.
+template <class T> void expectLumaAndChroma(const std::vector<std::array<T, 3>>& colors)
+{
+    constexpr int columns = 64;
+    for (std::size_t first = 0; first < colors.size(); first += columns) {
+        std::array<std::array<T, columns>, 3> samples = {};
+        const int count = static_cast<int>(std::min<std::size_t>(columns, colors.size() - first));
+        for (int x = 0; x < count; ++x) {
+            for (std::size_t c = 0; c < 3; ++c) samples[c][x] = colors[first + x][c];
+        }
+        LumaChroma<T, columns> converted;
+        toLumaChroma(samples[0].data(), samples[1].data(), samples[2].data(), converted, count);
+        for (int x = 0; x < count; ++x) {
+            const s32 r = samples[0][x], g = samples[1][x], b = samples[2][x];
+            ASSERT_EQ(converted.y[x], (66 * r + 129 * g + 25 * b + 128) >> 8) << r << ", " << g << ", " << b;
+            ASSERT_EQ(converted.cb[x], (-38 * r - 74 * g + 112 * b + 128) >> 8) << r << ", " << g << ", " << b;
+            ASSERT_EQ(converted.cr[x], (112 * r - 94 * g - 18 * b + 128) >> 8) << r << ", " << g << ", " << b;
+        }
+    }
+}
+
+TEST(Homogeneity, LumaAndChromaOfAllBytes)
+{
+    for (int r = 0; r < 256; ++r) {
+        std::vector<std::array<u8, 3>> colors;
+        for (int i = 0; i < 65536; ++i) {
+            colors.push_back({static_cast<u8>(r), static_cast<u8>(i >> 8), static_cast<u8>(i & 255)});
+        }
+        expectLumaAndChroma(colors);
+    }
+}
+
+TEST(Homogeneity, LumaAndChromaOfWords)
+{
+    std::vector<std::array<u16, 3>> colors;
+    const auto word = [] { return static_cast<u16>(numbers() & 0xffff); };
+    for (int i = 0; i < 500000; ++i) colors.push_back({word(), word(), word()});
+    for (int i = 0; i < 8; ++i) {
+        const auto end = [i](int bit) { return static_cast<u16>((i >> bit & 1) != 0 ? 65535 : 0); };
+        colors.push_back({end(0), end(1), end(2)});
+    }
+    expectLumaAndChroma(colors);
+}
+
+/// All that eight sums can be, each negative, zero or positive, behind either choice, and as the second of two eights.
+TEST(Homogeneity, ZeroFollowsTheSumInFront)
+{
+    constexpr int eights = 3 * 3 * 3 * 3 * 3 * 3 * 3 * 3;
+    for (int sums = 0; sums < eights; ++sums) {
+        for (const bool first : {false, true}) {
+            for (const int start : {0, 8}) {
+                Signs<16> signs = {};
+                if (start == 8) std::fill_n(first ? signs.negative : signs.zero, 8, u8{255});
+                std::array<u8, 8> expected;
+                bool last = first;
+                for (int x = 0, rest = sums; x < 8; ++x, rest /= 3) {
+                    signs.negative[start + x] = rest % 3 == 0 ? 255 : 0;
+                    signs.zero[start + x] = rest % 3 == 1 ? 255 : 0;
+                    if (rest % 3 != 1) last = rest % 3 == 0;
+                    expected[x] = last ? 255 : 0;
+                }
+                // Eight zeros keep what is in front of them; eight negative sums are what they are.
+                const std::uint64_t before = first && start == 0 ? 255 : 0;
+                EXPECT_EQ(decide(signs, start + 8, before), last ? 255U : 0U) << sums;
+                EXPECT_TRUE(std::equal(expected.begin(), expected.end(), signs.negative + start)) << sums;
+            }
+        }
+    }
+}
 
 } // namespace
