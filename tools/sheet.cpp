@@ -54,6 +54,10 @@ article {
   overflow: hidden; content-visibility: auto; contain-intrinsic-size: auto 430px;
 }
 article img { display: block; width: 100%; height: auto; }
+.figures { display: grid; gap: 12px; grid-template-columns: repeat(3, minmax(0, 360px)); margin-bottom: 20px; }
+figure { margin: 0; }
+figure img { display: block; width: 100%; height: auto; border-radius: 6px; image-rendering: pixelated; }
+figcaption { padding-top: 4px; color: var(--soft); font-size: 0.85rem; }
 .parts { padding: 10px 12px 4px; background: var(--well); }
 .names { display: flex; color: var(--soft); font-size: 0.78rem; }
 .names span { flex: 1; text-align: center; }
@@ -200,11 +204,23 @@ void writeIndex(std::ostream& out, const Sheet& sheet)
     out << "</ul>\n</nav>\n";
 }
 
+void writeFigures(std::ostream& out, const Section& section)
+{
+    if (section.figures.empty()) return;
+    out << "<p class=\"about\">" << escaped(section.aboutFigures) << "</p>\n<div class=\"figures\">\n";
+    for (const Figure& figure : section.figures) {
+        out << "<figure>" << image(figure.picture, figure.caption) << "<figcaption>" << escaped(figure.caption)
+            << "</figcaption></figure>\n";
+    }
+    out << "</div>\n";
+}
+
 void writeSection(std::ostream& out, const Section& section, RoiSize whole)
 {
     out << "<section id=\"" << section.family->slug << "\">\n<h2>" << escaped(section.family->title)
-        << " <a href=\"#index\">Index</a></h2>\n<p class=\"about\">" << escaped(section.family->text)
-        << "</p>\n<div class=\"cards\">\n";
+        << " <a href=\"#index\">Index</a></h2>\n<p class=\"about\">" << escaped(section.family->text) << "</p>\n";
+    writeFigures(out, section);
+    out << "<div class=\"cards\">\n";
     for (const Card& card : section.cards) writeCard(out, card, whole);
     out << "</div>\n</section>\n";
 }

@@ -30,9 +30,17 @@ struct Card {
     std::string note;      ///< why there is nothing to see
 };
 
+/// A picture that is not of one conversion alone.
+struct Figure {
+    Shown picture;
+    std::string caption;
+};
+
 struct Section {
     const catalog::FamilyInfo* family = nullptr;
     std::vector<Card> cards;
+    std::vector<Figure> figures = {};
+    std::string aboutFigures = {};
 };
 
 struct Sheet {

@@ -4,6 +4,7 @@
 #include <array>
 #include <cmath>
 #include <numbers>
+#include <span>
 
 namespace tool
 {
@@ -83,7 +84,7 @@ Color primaryRamps(Place at)
 }
 
 /// Rings whose frequency grows outwards, up to a pixel black and a pixel white at the farther sides of the panel.
-Color zonePlate(Place at)
+Color rings(Place at)
 {
     const double dx = at.column + 0.5 - at.width / 2, dy = at.row + 0.5 - at.height / 2;
     const double phase = std::numbers::pi * (dx * dx + dy * dy) / std::max(at.width, at.height);
@@ -120,14 +121,12 @@ struct Panel {
 };
 
 constexpr Panel panels[] = {
-    {0, 0, 1, 0.22, colorBars},         {0, 0.22, 1, 0.32, grayRamp},     {0, 0.32, 0.38, 0.66, hueField},
-    {0, 0.66, 0.38, 1, primaryRamps},   {0.38, 0.32, 0.76, 1, zonePlate}, {0.76, 0.32, 1, 0.66, skinTones},
+    {0, 0, 1, 0.22, colorBars},         {0, 0.22, 1, 0.32, grayRamp}, {0, 0.32, 0.38, 0.66, hueField},
+    {0, 0.66, 0.38, 1, primaryRamps},   {0.38, 0.32, 0.76, 1, rings}, {0.76, 0.32, 1, 0.66, skinTones},
     {0.76, 0.66, 1, 1, chromaPatterns},
 };
 
-} // namespace
-
-Image testCard(RoiSize size)
+Image drawn(RoiSize size, std::span<const Panel> panels)
 {
     Image card(rgb(), size);
     for (const Panel& panel : panels) {
@@ -145,6 +144,16 @@ Image testCard(RoiSize size)
         }
     }
     return card;
+}
+
+} // namespace
+
+Image testCard(RoiSize size) { return drawn(size, panels); }
+
+Image zonePlate(RoiSize size)
+{
+    constexpr Panel whole = {0, 0, 1, 1, rings};
+    return drawn(size, {&whole, 1});
 }
 
 } // namespace tool

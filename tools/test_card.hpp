@@ -10,4 +10,7 @@ namespace tool
 /// destroys; RGB C3 u8.
 Image testCard(RoiSize size);
 
+/// The zone plate alone.
+Image zonePlate(RoiSize size);
+
 } // namespace tool

@@ -3,6 +3,7 @@
 #include "convert.hpp"
 #include "failure.hpp"
 #include "image_file.hpp"
+#include "mosaic_figures.hpp"
 #include "preview.hpp"
 #include "sheet.hpp"
 
@@ -123,6 +124,11 @@ void writeTour(const Image& picture, const std::string& title, std::span<const c
             if (entry->family == family.family) section.cards.push_back(tour.visit(*entry));
         }
         if (section.cards.empty()) continue;
+        if (family.family == catalog::Family::demosaicAhd) {
+            section.aboutFigures = mosaicFiguresText;
+            for (const NamedImage& figure : mosaicFigures(picture))
+                section.figures.push_back({tour.show("mosaic." + figure.file + ".png", figure.image), figure.caption});
+        }
         progress << family.slug << ": " << section.cards.size() << std::endl;
         sheet.sections.push_back(std::move(section));
     }
