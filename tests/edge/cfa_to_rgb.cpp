@@ -132,6 +132,76 @@ TEST(CfaToRgb, ARegionIsAPartOfTheWhole)
     }
 }
 
+// A piece of the frame would be written around the region, and reads other samples than the two around it.
+TEST(CfaToRgb, ARegionInsideTouchesNoPieceOfTheFrame)
+{
+    constexpr int width = 16, height = 14, room = 4;
+    const RoiRect roi = {4, 5, 7, 4};
+    const Bytes mosaic = noise<u8>(width * height);
+    Bytes other = mosaic;
+    for (int y = 0; y < height; ++y) {
+        for (int x = 0; x < width; ++x) {
+            const bool isNear =
+                x >= roi.x - 2 && x < roi.x + roi.width + 2 && y >= roi.y - 2 && y < roi.y + roi.height + 2;
+            if (!isNear) other[static_cast<std::size_t>(y * width + x)] ^= 0xff;
+        }
+    }
+    const auto convertedRegion = [&](const Bytes& of, s32 grid) {
+        constexpr int step = 3 * (7 + 2 * room);
+        Bytes target(std::size_t{step} * (4 + 2 * room), unwritten);
+        EXPECT_EQ(pyxiCFAToRGB_8u_C1C3R(of.data(), roi, {width, height}, width, &target[room * step + 3 * room], step,
+                                        grid, 0),
+                  pyxOk);
+        return target;
+    };
+    for (s32 grid = 0; grid < 4; ++grid) {
+        const Bytes whole = converted(mosaic, {width, height}, grid), region = convertedRegion(mosaic, grid);
+        EXPECT_EQ(region, convertedRegion(other, grid)) << grid;
+        for (int y = -room; y < roi.height + room; ++y) {
+            for (int x = -room; x < roi.width + room; ++x) {
+                const bool isIn = x >= 0 && x < roi.width && y >= 0 && y < roi.height;
+                EXPECT_EQ(pixelAt(region, roi.width + 2 * room, x + room, y + room),
+                          isIn ? pixelAt(whole, width, roi.x + x, roi.y + y) : (Pixel<u8>{77, 77, 77}))
+                    << grid << ": " << x << ", " << y;
+            }
+        }
+    }
+}
+
+// Columns of the frame belong to a region that begins with them, and rows likewise: one that begins in front of the
+// mosaic has no part in the first two, but for what rows of the frame take along.
+TEST(CfaToRgb, ARegionThatBeginsInFrontOfTheMosaicLeavesOutTheFirstEdge)
+{
+    constexpr int size = 9, room = 4, pitch = size + 2 * room;
+    const Bytes around = noise<u8>(pitch * size);
+    Bytes mosaic;
+    for (int y = 0; y < size; ++y)
+        mosaic.insert(mosaic.end(), &around[y * pitch + room], &around[y * pitch + room + size]);
+    for (s32 grid = 0; grid < 4; ++grid) {
+        const Bytes whole = converted(mosaic, {size, size}, grid);
+        Bytes target(3 * 6 * 6, unwritten);
+        EXPECT_EQ(pyxiCFAToRGB_8u_C1C3R(&around[room], {-1, 0, 6, 6}, {size, size}, pitch, target.data(), 18, grid, 0),
+                  pyxOk);
+        for (int y = 0; y < 6; ++y) {
+            for (int x = y < 2 ? 0 : -1; x < 5; ++x) {
+                const bool isWritten = y < 2 || x >= 2;
+                EXPECT_EQ(pixelAt(target, 6, x + 1, y),
+                          isWritten ? pixelAt(whole, size, x, y) : (Pixel<u8>{77, 77, 77}))
+                    << grid << ": " << x << ", " << y;
+            }
+        }
+        target = Bytes(3 * 6 * 6, unwritten);
+        EXPECT_EQ(pyxiCFAToRGB_8u_C1C3R(&around[room], {0, -1, 6, 6}, {size, size}, pitch, target.data(), 18, grid, 0),
+                  pyxOk);
+        for (int y = -1; y < 5; ++y) {
+            for (int x = 0; x < 6; ++x) {
+                EXPECT_EQ(pixelAt(target, 6, x, y + 1), y >= 2 ? pixelAt(whole, size, x, y) : (Pixel<u8>{77, 77, 77}))
+                    << grid << ": " << x << ", " << y;
+            }
+        }
+    }
+}
+
 TEST(CfaToRgb, ARegionEndsWithTheMosaic)
 {
     const RoiSize size = {6, 6};

@@ -80,6 +80,46 @@ TEST(DemosaicAhdBlocks, NarrowRegionsAreWrittenAsFarAsTheInside)
     EXPECT_EQ(target.samples, Target().fill(0, 0, 2, 20, 100).fill(0, 5, 5, 19, 100).samples);
 }
 
+// The last row of red samples that is inside is at 24 or 25, so that the inside of a region from row 28 on is less than
+// empty: the bottom strip begins where it would end.
+TEST(DemosaicAhdBlocks, RegionsAtTheLowerEdgeAreWrittenInFront)
+{
+    const Mosaic mosaic(40, 30, flat);
+    Target target;
+    EXPECT_EQ(mosaic.convert({10, 28, 4, 2}, rggb, target), pyxOk); // (10, 28) is red: -3 rows are -4
+    EXPECT_EQ(target.samples, Target().fill(0, -4, 4, 2, 100).samples);
+    target = {};
+    EXPECT_EQ(mosaic.convert({10, 28, 4, 2}, bggr, target), pyxOk); // (11, 29) is red: -4 rows
+    EXPECT_EQ(target.samples, Target().fill(0, -3, 4, 2, 100).samples);
+}
+
+TEST(DemosaicAhdBlocks, RegionsAtTheRightEdgeAreWrittenInFront)
+{
+    const Mosaic mosaic(40, 30, flat);
+    Target target;
+    EXPECT_EQ(mosaic.convert({38, 6, 2, 10}, rggb, target), pyxOk); // (38, 6) is red: -3 columns are -4
+    EXPECT_EQ(target.samples, Target().fill(-4, 0, 2, 10, 100).samples);
+    target = {};
+    EXPECT_EQ(mosaic.convert({38, 6, 2, 10}, bggr, target), pyxOk); // (39, 7) is red: -4 columns, and 8 rows
+    EXPECT_EQ(target.samples, Target().fill(0, 0, 2, 10, 100).fill(-3, 1, 2, 9, 100).samples);
+}
+
+// Of a region of two columns the strip on its left is five wide, and six where (5, 5) is not red.
+TEST(DemosaicAhdBlocks, TheWorkspaceIsThirtyRowsOfTheWidestBlock)
+{
+    const Mosaic mosaic(40, 30, noise);
+    for (const auto& [grid, strip] : {std::pair{bggr, 5}, std::pair{rggb, 6}}) {
+        const int step = strip + 6;
+        Samples workspace(30 * step + 64, 99);
+        Target target;
+        EXPECT_EQ(pyxiDemosaicAHD_8u_C1C3R(mosaic.samples.data(), {0, 0, 2, 20}, {40, 30}, 40, target.first(),
+                                           Target::step, grid, &workspace[32], step),
+                  pyxOk);
+        EXPECT_EQ(Samples(workspace.begin(), workspace.begin() + 32), Samples(32, 99));
+        EXPECT_EQ(Samples(workspace.end() - 32, workspace.end()), Samples(32, 99));
+    }
+}
+
 TEST(DemosaicAhdBlocks, AtASizeOfFiveARowMoreIsWritten)
 {
     // The samples around the mosaic of 5 by 5 are read as well, and are alike.

@@ -235,4 +235,37 @@ TEST(Homogeneity, ZeroFollowsTheSumInFront)
     }
 }
 
+/// 50000 squared is 2500000000, and 4294967296 less in 32 bits with a sign; 46340 squared is the largest that fits.
+TEST(Homogeneity, SquaresOfTheChromaOfWordsWrap)
+{
+    LumaChroma<u16, 16> a = {}, b = {};
+    a.cb[0] = 25000, b.cb[0] = -25000;
+    a.cr[1] = -25000, b.cr[1] = 25000;
+    a.cb[2] = 46340;
+    a.cb[3] = 40000, a.cr[3] = -40000;
+    a.y[3] = 3, b.y[3] = 56000;
+    Distances<u16, 16> distances;
+    measure(a, 0, b, 0, distances, 4);
+    EXPECT_EQ(distances.chroma[0], -1794967296);
+    EXPECT_EQ(distances.chroma[1], -1794967296);
+    EXPECT_EQ(distances.chroma[2], 2147395600);
+    EXPECT_EQ(distances.chroma[3], 3200000000 - 4294967296);
+    EXPECT_EQ(distances.luma[3], 55997);
+}
+
+/// A distance that has wrapped is below all others: it sets the limit, and is within it.
+TEST(Homogeneity, WrappedDistancesAreTheSmallest)
+{
+    constexpr s32 wrapped = -1794967296;
+    Distances<u16, 16> hBeside = {}, hAbove = {}, hBelow = {}, vBeside = {}, vAbove = {}, vBelow = {};
+    // The larger one beside along the row is 5, the larger one above and below along the column has wrapped: that is
+    // the limit.
+    hBeside.chroma[0] = wrapped, hBeside.chroma[1] = 5, hAbove.chroma[0] = 0, hBelow.chroma[0] = 9;
+    vBeside.chroma[0] = 1, vBeside.chroma[1] = 0, vAbove.chroma[0] = wrapped, vBelow.chroma[0] = wrapped;
+    u8 score = 0;
+    scoreCandidates(DistancesAround<u16, 16>{&hBeside, &hAbove, &hBelow},
+                    DistancesAround<u16, 16>{&vBeside, &vAbove, &vBelow}, &score, 1);
+    EXPECT_EQ(score - noScore, 1 - 2);
+}
+
 } // namespace
