@@ -71,7 +71,10 @@ template <class... A> void readSignature(Export& entry)
     }
     if (entry.inPlace) entry.target = entry.source;
     Parameter& first = entry.traits.parameters[0];
-    if (entry.parameterCount == 1 && !entry.parameterTypes[0].pointer && first.name.empty()) first = aval;
+    if (entry.parameterCount == 1 && !entry.parameterTypes[0].pointer && first.name.empty()) {
+        const std::string_view type = entry.parameterTypes[0].type;
+        first = type == "f32" ? avalOfFloats : type == "u16" ? avalOfWords : aval;
+    }
 }
 
 template <class... A>
@@ -91,6 +94,7 @@ Export describe(std::string_view name, PyxStatus(PYXCC_CALL* function)(A...), Fa
     entry.target.chromaUp = traits.targetChromaUp;
     entry.source.byteInFront = traits.sourceByteInFront;
     entry.target.bitsInFront = traits.targetBitsInFront;
+    if (!traits.writes.empty()) entry.target.model = traits.writes;
     if (traits.wholeSteps) {
         for (Side* side : {&entry.source, &entry.target}) side->stepUnit = sizeOf(side->element);
     }

@@ -109,7 +109,10 @@ struct Parameter {
     std::span<const int> only = {};       ///< all the numbers that make sense, where not all of low to high do
 };
 
+/// The fourth sample, opaque.
 inline constexpr Parameter aval{"aval", 0, 255, 0, {255}};
+inline constexpr Parameter avalOfWords{"aval", 0, 65535, 0, {65535}};
+inline constexpr Parameter avalOfFloats{"aval", 0, 1, 0, {1}};
 inline constexpr Parameter alphaOfBytes{"alphaValue", 0, 255, 0, {255}};
 inline constexpr Parameter alphaOfWords{"alphaValue", -32768, 32767, 0, {32767}};
 
@@ -212,6 +215,7 @@ struct Traits {
     bool (*allocates)(const Invocation&) = nullptr; ///< which calls take scratch memory from the core library
     Beyond (*beyond)(double, RoiSize) = nullptr;    ///< rows outside of the region, by the first parameter
     int withinImagesFrom = 1;                       ///< a call of a lesser width or height goes beyond its images
+    std::string_view writes = {};                   ///< the target's model, where it is not the one of the name
 };
 
 enum class Arrangement {

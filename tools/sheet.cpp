@@ -140,8 +140,7 @@ std::string breakable(std::string_view name)
 
 std::string_view toneOf(PyxStatus status) { return status < 0 ? "bad" : status > 0 ? "warn" : "good"; }
 
-/// `whole` is the size of the picture, of which a conversion may have taken a part.
-void writeCard(std::ostream& out, const Card& card, RoiSize whole)
+void writeCard(std::ostream& out, const Card& card)
 {
     const std::string name(card.entry->name);
     out << "<article id=\"" << name << "\">\n";
@@ -164,9 +163,6 @@ void writeCard(std::ostream& out, const Card& card, RoiSize whole)
             out << "<span>" << timeText(card.seconds) << "</span><span>" << rateText(card.bytes, card.seconds)
                 << "</span>";
         }
-        if (card.size.width != whole.width || card.size.height != whole.height) {
-            out << "<span>" << card.size.width << " × " << card.size.height << "</span>";
-        }
         out << "</p>\n";
     }
     if (!card.madeBy.empty()) out << "<p class=\"way\">Source: " << escaped(card.madeBy) << "</p>\n";
@@ -181,15 +177,20 @@ void writeHead(std::ostream& out, const Sheet& sheet)
         << "<title>pyxcc: " << escaped(sheet.title) << "</title>\n<style>" << style << "</style>\n</head>\n";
 }
 
+std::string sizeText(RoiSize size) { return std::to_string(size.width) + " × " + std::to_string(size.height); }
+
 void writeTitle(std::ostream& out, const Sheet& sheet)
 {
     std::size_t count = 0;
     for (const Section& section : sheet.sections) count += section.cards.size();
     out << "<header>\n"
         << image(sheet.picture, "The source picture") << "\n<div>\n<h1>pyxcc tour</h1>\n<p>" << count
-        << (count == 1 ? " conversion of " : " conversions of ") << escaped(sheet.title) << ", " << sheet.size.width
-        << " × " << sheet.size.height << "</p>\n<p>Library " << escaped(pyxccGetLibVersion()->versionText)
-        << "</p>\n</div>\n</header>\n";
+        << (count == 1 ? " conversion of " : " conversions of ") << escaped(sheet.title) << ", "
+        << sizeText(sheet.given);
+    if (sheet.size.width != sheet.given.width || sheet.size.height != sheet.given.height) {
+        out << ", of which " << sizeText(sheet.size) << " in whole blocks";
+    }
+    out << "</p>\n<p>Library " << escaped(pyxccGetLibVersion()->versionText) << "</p>\n</div>\n</header>\n";
 }
 
 void writeIndex(std::ostream& out, const Sheet& sheet)
@@ -215,13 +216,13 @@ void writeFigures(std::ostream& out, const Section& section)
     out << "</div>\n";
 }
 
-void writeSection(std::ostream& out, const Section& section, RoiSize whole)
+void writeSection(std::ostream& out, const Section& section)
 {
     out << "<section id=\"" << section.family->slug << "\">\n<h2>" << escaped(section.family->title)
         << " <a href=\"#index\">Index</a></h2>\n<p class=\"about\">" << escaped(section.family->text) << "</p>\n";
     writeFigures(out, section);
     out << "<div class=\"cards\">\n";
-    for (const Card& card : section.cards) writeCard(out, card, whole);
+    for (const Card& card : section.cards) writeCard(out, card);
     out << "</div>\n</section>\n";
 }
 
@@ -254,7 +255,7 @@ std::string html(const Sheet& sheet)
     writeTitle(out, sheet);
     writeIndex(out, sheet);
     out << "<main>\n";
-    for (const Section& section : sheet.sections) writeSection(out, section, sheet.size);
+    for (const Section& section : sheet.sections) writeSection(out, section);
     out << "</main>\n<footer>" << legend << "</footer>\n<script>" << script << "</script>\n</body>\n</html>\n";
     return out.str();
 }

@@ -22,12 +22,11 @@ struct Card {
     std::vector<std::string_view> components; ///< what the tiles show
     bool called = false;
     PyxStatus status = 0;
-    RoiSize size = {0, 0}; ///< of the region
-    double seconds = 0;    ///< of a call
-    double bytes = 0;      ///< read and written by a call
-    std::string madeBy;    ///< how the source was made from the picture
-    std::string shownBy;   ///< how the target was brought back
-    std::string note;      ///< why there is nothing to see
+    double seconds = 0;  ///< of a call
+    double bytes = 0;    ///< read and written by a call
+    std::string madeBy;  ///< how the source was made from the picture
+    std::string shownBy; ///< how the target was brought back
+    std::string note;    ///< why there is nothing to see
 };
 
 /// A picture that is not of one conversion alone.
@@ -46,7 +45,8 @@ struct Section {
 struct Sheet {
     std::string title;
     Shown picture;
-    RoiSize size = {0, 0}; ///< of the whole picture
+    RoiSize given = {0, 0}; ///< of the whole picture
+    RoiSize size = {0, 0};  ///< of the part that was converted
     std::vector<Section> sections;
 };
 

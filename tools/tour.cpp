@@ -20,11 +20,12 @@ namespace
 constexpr RoiSize pictureBox = {480, 720};
 constexpr double secondsForEach = 0.02;
 
-/// The largest size within `size` that is a multiple of what the export asks for.
-RoiSize wholeBlocks(const catalog::Minimum& minimum, RoiSize size)
+/// The part of the picture in whole blocks of all chroma forms and filters. What conversions leave of a part of a block
+/// would show as a stripe of green or black.
+Image inWholeBlocks(const Image& picture)
 {
-    return {size.width / minimum.widthMultiple * minimum.widthMultiple,
-            size.height / minimum.heightMultiple * minimum.heightMultiple};
+    const auto whole = [](int length, int block) { return length < block ? length : length / block * block; };
+    return cropped(picture, {whole(picture.size().width, 4), whole(picture.size().height, 8)});
 }
 
 /// The image at the end of the route; if an export fails on it, `why` tells so.
@@ -56,19 +57,18 @@ public:
     {
         Card card;
         card.entry = &entry;
-        card.size = wholeBlocks(entry.traits.minimum, picture_.size());
         const auto way = graph_.find(picture_.format(), sourceOf(entry));
         if (!way) {
             card.note = "No conversion makes its source yet.";
             return card;
         }
         const int least = entry.traits.withinImagesFrom;
-        if (card.size.width < least || card.size.height < least) {
+        if (picture_.size().width < least || picture_.size().height < least) {
             card.note = "The picture is too small.";
             return card;
         }
         card.madeBy = describe(*way);
-        if (const auto source = tryFollow(*way, cropped(picture_, card.size), card.note)) call(card, *source);
+        if (const auto source = tryFollow(*way, picture_, card.note)) call(card, *source);
         return card;
     }
 
@@ -92,7 +92,7 @@ private:
         const std::string name(card.entry->name);
         card.components = componentsOf(target.side());
         const int tiles = std::max(static_cast<int>(card.components.size()), 3);
-        const RoiSize tile = fitted(card.size, {pictureBox.width / tiles, pictureBox.height / tiles});
+        const RoiSize tile = fitted(picture_.size(), {pictureBox.width / tiles, pictureBox.height / tiles});
         card.tiles = show(name + ".parts.png", componentTiles(target, tile));
         const auto back = wayToPicture(graph_, target.format());
         if (!back) {
@@ -111,12 +111,13 @@ private:
 
 } // namespace
 
-void writeTour(const Image& picture, const std::string& title, std::span<const catalog::Export* const> exports,
+void writeTour(const Image& given, const std::string& title, std::span<const catalog::Export* const> exports,
                const fs::path& directory, std::ostream& progress)
 {
+    const Image picture = inWholeBlocks(given);
     StagedDirectory staged(directory);
     const Tour tour(picture, staged);
-    Sheet sheet{title, {}, picture.size(), {}};
+    Sheet sheet{title, {}, given.size(), picture.size(), {}};
     sheet.picture = tour.show("picture.png", eightBit(scaledDown(picture, pictureBox)));
     for (const catalog::FamilyInfo& family : catalog::families()) {
         Section section{&family, {}};

@@ -130,10 +130,9 @@ Sheet smallSheet()
     card.entry = &catalog::exports().front();
     card.picture = {"a<b.png", {3, 2}};
     card.called = true;
-    card.size = {3, 2};
     card.seconds = 0.0025;
     card.bytes = 5e6;
-    return {"a <title> & \"more\"", {"picture.png", {3, 2}}, {3, 2}, {{&catalog::families().front(), {card}}}};
+    return {"a <title> & \"more\"", {"picture.png", {3, 2}}, {5, 3}, {3, 2}, {{&catalog::families().front(), {card}}}};
 }
 
 TEST(Sheet, EscapesWhatTheUserNamed)
@@ -142,6 +141,14 @@ TEST(Sheet, EscapesWhatTheUserNamed)
     EXPECT_NE(page.find("a &lt;title&gt; &amp; &quot;more&quot;"), std::string::npos);
     EXPECT_NE(page.find("src=\"a&lt;b.png\""), std::string::npos);
     EXPECT_EQ(page.find("<title>a <title>"), std::string::npos);
+}
+
+TEST(Sheet, TellsWhichPartOfThePictureWasTaken)
+{
+    Sheet sheet = smallSheet();
+    EXPECT_NE(html(sheet).find("5 × 3, of which 3 × 2 in whole blocks</p>"), std::string::npos);
+    sheet.size = sheet.given;
+    EXPECT_NE(html(sheet).find("5 × 3</p>"), std::string::npos);
 }
 
 TEST(Sheet, NeedsNothingFromElsewhere)

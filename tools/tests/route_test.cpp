@@ -169,6 +169,27 @@ TEST(Follow, StopsAtAnErrorButNotAtAWarning)
     EXPECT_NE(failureOf([&] { follow(route, image); }).find("export returns pyxErrSize (-6)"), std::string::npos);
 }
 
+// Chroma that changes places on the way there and back makes red blue.
+TEST(Follow, BringsRedBackFromEveryFormat)
+{
+    Image red(rgb(), {16, 8});
+    for (int y = 0; y < 8; ++y) {
+        for (int x = 0; x < 16; ++x) component(red, 0).set(x, y, 200);
+    }
+    const Graph graph(catalog::exports());
+    int formats = 0;
+    for (const catalog::Export& entry : catalog::exports()) {
+        const Format format = sourceOf(entry);
+        const auto there = graph.find(red.format(), format), back = wayToPicture(graph, format);
+        if (!there || !back || componentsOf(format.side).size() < 3) continue;
+        const Image picture = eightBit(follow(*back, follow(*there, red)));
+        EXPECT_GT(component(picture, 0).at(5, 3), component(picture, 2).at(5, 3) + 50)
+            << describe(*there) << "; " << describe(*back);
+        ++formats;
+    }
+    EXPECT_GT(formats, 400);
+}
+
 TEST(Measure, TellsStatusAndTraffic)
 {
     const catalog::Export* entry = catalog::find("pyxiYCbCrToRGB_8u_P3C4R");
