@@ -1,7 +1,8 @@
 // The two candidates for each pixel of a mosaic, one made along rows and one along columns, and which is the smoother.
 //
 // Each form goes along a row, and the compiler makes vector code of it: there is no branch, choices are made by masks
-// of all bits or none, and the rows that are written lie apart from all others.
+// of all bits or none, and the rows that are written lie apart from all others. A count is a constant where it can be,
+// so that no column is left over for the compiler to make code of that takes one at a time.
 #pragma once
 
 #include "pyxcc/types.h"
@@ -63,16 +64,15 @@ template <class Number> Number where(Number mask, Number yes, Number no)
 
 template <class T> T saturated(NumberFor<T> value)
 {
-    constexpr NumberFor<T> most = std::numeric_limits<T>::max();
-    const NumberFor<T> atLeast = value > 0 ? value : NumberFor<T>{0};
-    return static_cast<T>(atLeast < most ? atLeast : most);
+    constexpr NumberFor<T> least = 0, most = std::numeric_limits<T>::max();
+    return static_cast<T>(std::min(std::max(value, least), most));
 }
 
 } // namespace detail
 
 /// Green along the row and along the column. `rows` are five, [2] is the row itself. `count` is no more than `Columns`.
-template <int Columns, class T>
-void interpolateGreen(const T* const rows[5], T* __restrict alongRow, T* __restrict alongColumn, int count,
+template <int Columns, class T, class Count>
+void interpolateGreen(const T* const rows[5], T* __restrict alongRow, T* __restrict alongColumn, Count count,
                       GreenParity green)
 {
     const T *const up2 = rows[0], *const up = rows[1], *const at = rows[2], *const down = rows[3],
@@ -90,9 +90,9 @@ void interpolateGreen(const T* const rows[5], T* __restrict alongRow, T* __restr
 
 /// The colour that a row has besides green, and the one that it has not, by what they differ from green around. `count`
 /// is no more than `Columns`.
-template <int Columns, class T>
+template <int Columns, class T, class Count>
 void interpolateColors(const ThreeRows<T>& mosaic, const ThreeRows<T>& greens, T* __restrict ofRow,
-                       T* __restrict ofOthers, int count, GreenParity green)
+                       T* __restrict ofOthers, Count count, GreenParity green)
 {
     using Number = NumberFor<T>;
     const Number* const masks = detail::greenMasks<Number, Columns>(green);
@@ -115,17 +115,17 @@ void interpolateColors(const ThreeRows<T>& mosaic, const ThreeRows<T>& greens, T
     }
 }
 
-/// Luma and chroma of a stretch of a row.
+/// Luma and chroma of a stretch of a row, and one column more, which may be looked at but does not count.
 template <class T, int Columns> struct LumaChroma {
     using Number = NumberFor<T>;
-    alignas(32) Number y[Columns], cb[Columns], cr[Columns];
+    alignas(32) Number y[Columns + 1], cb[Columns + 1], cr[Columns + 1];
 };
 
 /// (66 R + 129 G + 25 B + 128) >> 8 and so on, by what red and blue have more than green: that takes fewer products.
 /// The weights of chroma add up to nothing. 16 bits hold the sums for bytes: that for luma without a sign, those for
 /// chroma with one.
-template <class T, int Columns>
-void toLumaChroma(const T* red, const T* green, const T* blue, LumaChroma<T, Columns>& to, int count)
+template <class T, int Columns, class Count>
+void toLumaChroma(const T* red, const T* green, const T* blue, LumaChroma<T, Columns>& to, Count count)
 {
     using Number = typename LumaChroma<T, Columns>::Number;
     using Luma = std::make_unsigned_t<Number>;
@@ -139,26 +139,26 @@ void toLumaChroma(const T* red, const T* green, const T* blue, LumaChroma<T, Col
         toCb[x] = static_cast<Number>(static_cast<Number>(112 * b - 38 * r + 128) >> 8);
         toCr[x] = static_cast<Number>(static_cast<Number>(112 * r - 18 * b + 128) >> 8);
     }
+    toY[count] = toCb[count] = toCr[count] = 0;
 }
 
 /// A sum of two squares of chroma. Those of bytes are below 65536: the largest is that of green and magenta. Those of
 /// 16-bit samples may leave 32 bits, and wrap.
 template <class T> using SquaresFor = std::conditional_t<sizeof(T) == 1, u16, s32>;
 
-/// How far samples are from their neighbours.
+/// How far samples are from their neighbours; one more than count here, too.
 template <class T, int Columns> struct Distances {
-    alignas(32) NumberFor<T> luma[Columns];
-    alignas(32) SquaresFor<T> chroma[Columns];
+    alignas(32) NumberFor<T> luma[Columns + 1];
+    alignas(32) SquaresFor<T> chroma[Columns + 1];
 };
 
-/// Between the samples from column `i` of one row on and those from column `k` of another.
-template <class T, int Columns>
-void measure(const LumaChroma<T, Columns>& a, int i, const LumaChroma<T, Columns>& b, int k, Distances<T, Columns>& to,
-             int count)
+/// Between the samples of one row and those of another, from its column `from` on.
+template <int from, class T, int Columns, class Count>
+void measure(const LumaChroma<T, Columns>& a, const LumaChroma<T, Columns>& b, Distances<T, Columns>& to, Count count)
 {
     using Number = NumberFor<T>;
-    const Number *const ay = a.y + i, *const acb = a.cb + i, *const acr = a.cr + i;
-    const Number *const by = b.y + k, *const bcb = b.cb + k, *const bcr = b.cr + k;
+    const Number *const ay = a.y, *const acb = a.cb, *const acr = a.cr;
+    const Number *const by = b.y + from, *const bcb = b.cb + from, *const bcr = b.cr + from;
     NumberFor<T>* __restrict const luma = to.luma;
     SquaresFor<T>* __restrict const chroma = to.chroma;
     for (int x = 0; x < count; ++x) {
@@ -168,10 +168,11 @@ void measure(const LumaChroma<T, Columns>& a, int i, const LumaChroma<T, Columns
         const auto cr = static_cast<u32>(static_cast<Number>(acr[x] - bcr[x]));
         chroma[x] = static_cast<SquaresFor<T>>(cb * cb + cr * cr);
     }
+    luma[count] = 0;
+    chroma[count] = 0;
 }
 
-/// Those of a row of a candidate: along the row, those at x are between the columns x - 1 and x; then to the rows above
-/// and below.
+/// Those of a row of a candidate: beside[x] is between the columns x and x + 1; then those to the rows above and below.
 template <class T, int Columns> struct DistancesAround {
     const Distances<T, Columns>*beside, *above, *below;
 };
@@ -179,31 +180,37 @@ template <class T, int Columns> struct DistancesAround {
 /// What is added to scores, so that they have no sign.
 inline constexpr int noScore = 4;
 
-/// How many more of its neighbours the candidate along the row resembles than the one along the column.
-template <class T, int Columns>
+/// How many more of its neighbours the candidate along the row resembles than the one along the column, for all of
+/// `count` columns but the first and the last.
+template <class T, int Columns, class Count>
 void scoreCandidates(const DistancesAround<T, Columns>& h, const DistancesAround<T, Columns>& v, u8* __restrict scores,
-                     int count)
+                     Count count)
 {
     using Luma = NumberFor<T>;
     using Chroma = SquaresFor<T>;
-    const Luma *const hBeside = h.beside->luma, *const hAbove = h.above->luma, *const hBelow = h.below->luma;
-    const Luma *const vBeside = v.beside->luma, *const vAbove = v.above->luma, *const vBelow = v.below->luma;
-    const Chroma *const hBesideC = h.beside->chroma, *const hAboveC = h.above->chroma, *const hBelowC = h.below->chroma;
-    const Chroma *const vBesideC = v.beside->chroma, *const vAboveC = v.above->chroma, *const vBelowC = v.below->chroma;
+    const Luma *const hBeside = h.beside->luma, *const hAbove = h.above->luma + 1, *const hBelow = h.below->luma + 1;
+    const Luma *const vBeside = v.beside->luma, *const vAbove = v.above->luma + 1, *const vBelow = v.below->luma + 1;
+    const Chroma *const hBesideC = h.beside->chroma, *const vBesideC = v.beside->chroma;
+    const Chroma *const hAboveC = h.above->chroma + 1, *const hBelowC = h.below->chroma + 1;
+    const Chroma *const vAboveC = v.above->chroma + 1, *const vBelowC = v.below->chroma + 1;
+    alignas(32) Luma more[Columns]; // in a row of its own, or else the compiler narrows each comparison
     for (int x = 0; x < count; ++x) {
         const Luma limit = std::min(std::max(hBeside[x], hBeside[x + 1]), std::max(vAbove[x], vBelow[x]));
         const Chroma limitC = std::min(std::max(hBesideC[x], hBesideC[x + 1]), std::max(vAboveC[x], vBelowC[x]));
-        const auto isWithin = [&](Luma luma, Chroma chroma) {
-            return static_cast<Luma>(static_cast<Luma>(luma <= limit) & static_cast<Luma>(chroma <= limitC));
+        // -1 for what is too far: comparisons are masks.
+        const auto isBeyond = [&](Luma luma, Chroma chroma) {
+            const Luma far = luma > limit ? Luma{-1} : Luma{0}, farC = chroma > limitC ? Luma{-1} : Luma{0};
+            return static_cast<Luma>(far | farC);
         };
         const auto alongRow =
-            static_cast<Luma>(isWithin(hBeside[x], hBesideC[x]) + isWithin(hBeside[x + 1], hBesideC[x + 1]) +
-                              isWithin(hAbove[x], hAboveC[x]) + isWithin(hBelow[x], hBelowC[x]));
+            static_cast<Luma>(isBeyond(hBeside[x], hBesideC[x]) + isBeyond(hBeside[x + 1], hBesideC[x + 1]) +
+                              isBeyond(hAbove[x], hAboveC[x]) + isBeyond(hBelow[x], hBelowC[x]));
         const auto alongColumn =
-            static_cast<Luma>(isWithin(vBeside[x], vBesideC[x]) + isWithin(vBeside[x + 1], vBesideC[x + 1]) +
-                              isWithin(vAbove[x], vAboveC[x]) + isWithin(vBelow[x], vBelowC[x]));
-        scores[x] = static_cast<u8>(alongRow - alongColumn + noScore);
+            static_cast<Luma>(isBeyond(vBeside[x], vBesideC[x]) + isBeyond(vBeside[x + 1], vBesideC[x + 1]) +
+                              isBeyond(vAbove[x], vAboveC[x]) + isBeyond(vBelow[x], vBelowC[x]));
+        more[x] = static_cast<Luma>(alongRow - alongColumn);
     }
+    for (int x = 0; x < count - 2; ++x) scores[x] = static_cast<u8>(more[x] + noScore);
 }
 
 /// Masks of places where the sum of three by three scores is below zero, and of those where it is zero.
@@ -211,7 +218,7 @@ template <int Columns> struct Signs {
     alignas(32) u8 negative[Columns], zero[Columns];
 };
 
-template <int Columns> void addScores(const ThreeRows<u8>& scores, Signs<Columns>& signs, int count)
+template <int Columns, class Count> void addScores(const ThreeRows<u8>& scores, Signs<Columns>& signs, Count count)
 {
     static_assert(9 * 2 * noScore < 256);
     constexpr int none = 9 * noScore;
@@ -247,8 +254,8 @@ template <int Columns> std::uint64_t decide(Signs<Columns>& signs, int count, st
     return last;
 }
 
-template <class T>
-void choose(const u8* __restrict masks, const T* alongRow, const T* alongColumn, T* __restrict chosen, int count)
+template <class T, class Count>
+void choose(const u8* __restrict masks, const T* alongRow, const T* alongColumn, T* __restrict chosen, Count count)
 {
     for (int x = 0; x < count; ++x) {
         const auto mask = static_cast<T>(static_cast<s8>(masks[x]));

@@ -8,6 +8,7 @@
 #include "mosaic/sites.hpp"
 
 #include <array>
+#include <type_traits>
 
 using namespace pyxcc::frame;
 using namespace pyxcc::layouts;
@@ -97,9 +98,11 @@ private:
     static constexpr int stretch = 256 / static_cast<int>(sizeof(T));
 
     /// Calls with each stretch of columns [from, to) of the planes.
-    template <class Step> static void eachStretch(int from, int to, const Step& step)
+    template <int Length = stretch, class Step> static void eachStretch(int from, int to, const Step& step)
     {
-        for (int at = from; at < to; at += stretch) step(at, std::min(stretch, to - at));
+        int at = from;
+        for (; at <= to - Length; at += Length) step(at, std::integral_constant<int, Length>{});
+        if (at < to) step(at, to - at);
     }
 
     /// Column `column` of the planes is this one of the mosaic.
@@ -109,7 +112,7 @@ private:
 
     void fillGreen(s32 y) const
     {
-        eachStretch(0, width_ + 6, [&](int column, int count) {
+        eachStretch(0, width_ + 6, [&](int column, auto count) {
             T buffers[5][stretch + 4];
             const T* rows[5];
             for (int i = 0; i < 5; ++i) {
@@ -123,7 +126,7 @@ private:
     void fillColors(s32 y) const
     {
         const bool redRow = isOfRedRow(siteAt(work_.grid, x_, y));
-        eachStretch(1, width_ + 5, [&](int column, int count) {
+        eachStretch(1, width_ + 5, [&](int column, auto count) {
             T buffers[3][stretch + 2];
             ThreeRows<T> mosaic;
             for (int i = 0; i < 3; ++i) {
@@ -141,48 +144,49 @@ private:
 
     /// The distances of rows of a candidate from each other and along each of those within.
     struct Measured {
-        Distances<T, stretch + 2> between[3], beside[2];
+        Distances<T, stretch> between[3], beside[2];
 
-        DistancesAround<T, stretch + 2> around(int row) const
-        {
-            return {&beside[row], &between[row], &between[row + 1]};
-        }
+        DistancesAround<T, stretch> around(int row) const { return {&beside[row], &between[row], &between[row + 1]}; }
     };
 
     void fillScores(s32 y, int rows) const
     {
-        eachStretch(2, width_ + 4, [&](int column, int count) {
+        eachStretch<stretch - 2>(2, width_ + 4, [&](int column, auto count) {
+            const auto withNeighbors = more<2>(count);
             Measured alongRow, alongColumn;
-            measureCandidate(planes_.alongRow, y, rows, column, alongRow, count);
-            measureCandidate(planes_.alongColumn, y, rows, column, alongColumn, count);
+            measureCandidate(planes_.alongRow, y, rows, column - 1, alongRow, withNeighbors);
+            measureCandidate(planes_.alongColumn, y, rows, column - 1, alongColumn, withNeighbors);
             for (int i = 0; i < rows; ++i) {
-                scoreCandidates(alongRow.around(i), alongColumn.around(i), planes_.score.row(y + i) + column, count);
+                scoreCandidates(alongRow.around(i), alongColumn.around(i), planes_.score.row(y + i) + column,
+                                withNeighbors);
             }
         });
     }
 
-    /// The column in front of the first is at index 0 of luma and chroma.
-    static void measureCandidate(const typename Planes<T>::Candidate& candidate, s32 y, int rows, int column,
-                                 Measured& to, int count)
+    template <int By, int Count> static constexpr auto more(std::integral_constant<int, Count>)
     {
-        LumaChroma<T, stretch + 2> converted[4];
-        for (int i = 0; i < rows + 2; ++i) convertCandidate(candidate, y + i - 1, column - 1, converted[i], count + 2);
-        for (int i = 0; i < rows + 1; ++i) measure(converted[i], 1, converted[i + 1], 1, to.between[i], count);
-        for (int i = 0; i < rows; ++i) measure(converted[i + 1], 0, converted[i + 1], 1, to.beside[i], count + 1);
+        return std::integral_constant<int, Count + By>{};
     }
+    template <int By> static constexpr int more(int count) { return count + By; }
 
-    static void convertCandidate(const typename Planes<T>::Candidate& candidate, s32 y, int column,
-                                 LumaChroma<T, stretch + 2>& to, int count)
+    template <class Count>
+    static void measureCandidate(const typename Planes<T>::Candidate& candidate, s32 y, int rows, int column,
+                                 Measured& to, Count count)
     {
-        toLumaChroma(candidate.red.row(y) + column, candidate.green.row(y) + column, candidate.blue.row(y) + column, to,
-                     count);
+        LumaChroma<T, stretch> converted[4];
+        for (int i = 0; i < rows + 2; ++i) {
+            const auto from = [y = y + i - 1, column](const auto& ring) { return ring.row(y) + column; };
+            toLumaChroma(from(candidate.red), from(candidate.green), from(candidate.blue), converted[i], count);
+        }
+        for (int i = 0; i < rows + 1; ++i) measure<0>(converted[i], converted[i + 1], to.between[i], count);
+        for (int i = 0; i < rows; ++i) measure<1>(converted[i + 1], converted[i + 1], to.beside[i], count);
     }
 
     void emit(s32 y) const
     {
         std::uint64_t last = 0;
         u8* const target = targetRow(y);
-        eachStretch(3, width_ + 3, [&](int column, int count) {
+        eachStretch(3, width_ + 3, [&](int column, auto count) {
             Signs<stretch> signs = {}; // whole eights are decided
             addScores(planes_.score.around(y, column), signs, count);
             last = decide(signs, count, last);

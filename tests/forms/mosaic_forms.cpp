@@ -245,7 +245,7 @@ TEST(Homogeneity, SquaresOfTheChromaOfWordsWrap)
     a.cb[3] = 40000, a.cr[3] = -40000;
     a.y[3] = 3, b.y[3] = 56000;
     Distances<u16, 16> distances;
-    measure(a, 0, b, 0, distances, 4);
+    measure<0>(a, b, distances, 4);
     EXPECT_EQ(distances.chroma[0], -1794967296);
     EXPECT_EQ(distances.chroma[1], -1794967296);
     EXPECT_EQ(distances.chroma[2], 2147395600);
@@ -260,11 +260,11 @@ TEST(Homogeneity, WrappedDistancesAreTheSmallest)
     Distances<u16, 16> hBeside = {}, hAbove = {}, hBelow = {}, vBeside = {}, vAbove = {}, vBelow = {};
     // The larger one beside along the row is 5, the larger one above and below along the column has wrapped: that is
     // the limit.
-    hBeside.chroma[0] = wrapped, hBeside.chroma[1] = 5, hAbove.chroma[0] = 0, hBelow.chroma[0] = 9;
-    vBeside.chroma[0] = 1, vBeside.chroma[1] = 0, vAbove.chroma[0] = wrapped, vBelow.chroma[0] = wrapped;
+    hBeside.chroma[0] = wrapped, hBeside.chroma[1] = 5, hAbove.chroma[1] = 0, hBelow.chroma[1] = 9;
+    vBeside.chroma[0] = 1, vBeside.chroma[1] = 0, vAbove.chroma[1] = wrapped, vBelow.chroma[1] = wrapped;
     u8 score = 0;
     scoreCandidates(DistancesAround<u16, 16>{&hBeside, &hAbove, &hBelow},
-                    DistancesAround<u16, 16>{&vBeside, &vAbove, &vBelow}, &score, 1);
+                    DistancesAround<u16, 16>{&vBeside, &vAbove, &vBelow}, &score, 3);
     EXPECT_EQ(score - noScore, 1 - 2);
 }
 
