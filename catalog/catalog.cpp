@@ -93,6 +93,7 @@ Export describe(std::string_view name, PyxStatus(PYXCC_CALL* function)(A...), Fa
     entry.source.chromaUp = traits.sourceChromaUp;
     entry.target.chromaUp = traits.targetChromaUp;
     entry.source.byteInFront = traits.sourceByteInFront;
+    entry.source.rowUnit = traits.sourceRowUnit;
     entry.target.bitsInFront = traits.targetBitsInFront;
     if (!traits.writes.empty()) entry.target.model = traits.writes;
     if (traits.wholeSteps) {

@@ -207,6 +207,7 @@ struct Traits {
     bool sourceChromaUp = false;             ///< the source has a chroma sample for a part of a block, too
     bool targetChromaUp = false;             ///< and so has the target
     int sourceByteInFront = 0;               ///< so far in front of a row of the source one pixel wide, a byte is read
+    int sourceRowUnit = 1;                   ///< where a row of the source begins counts by multiples of this
     int targetBitsInFront = 0;               ///< so many bits may lie in front of a row of the target
     Range range = {};                        ///< of the source's samples
     double tolerance = 0;                    ///< by which a target sample may be off, where its last bit is left open
@@ -240,6 +241,7 @@ struct Side {
     int byteInFront = 0;          ///< so far in front of a row, if that is one pixel wide, a byte is read
     bool spareFourth = false;     ///< AC4: the fourth sample is not read, or keeps its value
     int bitsInFront = 0;          ///< so many may lie in front of a row of bits
+    int rowUnit = 1;              ///< where a row begins counts by multiples of this
     int stepUnit = 1;             ///< of a step, only whole multiples of this count
 };
 

@@ -53,3 +53,11 @@ build() {
     cmake --preset "$preset"
     cmake --build --preset "$preset" --parallel "$jobs" ${1:+--target "$@"}
 }
+
+# Sanitizers want parts of the address space that a kernel with much address randomisation does not leave free. Starts
+# the script once more where it does: withFixedAddresses "$@".
+withFixedAddresses() {
+    if [[ -z ${PYXCC_FIXED_ADDRESSES:-} ]] && setarch -R true 2>/dev/null; then
+        PYXCC_FIXED_ADDRESSES=1 exec setarch -R "$self" "$@"
+    fi
+}

@@ -1,149 +1,21 @@
+#include "support/faults.hpp"
 #include "conformance/suites.hpp"
-#include "support/compare.hpp"
-#include "support/expected_status.hpp"
-#include "support/scene.hpp"
-
-#include <functional>
-#include <limits>
-#include <set>
-#include <vector>
 
 namespace conformance
 {
 
 using namespace support;
-using catalog::Arrangement;
-using catalog::Export;
-using catalog::Invocation;
-using catalog::Side;
 
 namespace
 {
 
-/// Something wrong with a call.
-struct Fault {
-    std::string text;
-    std::function<void(Invocation&)> apply;
-};
-
-using Faults = std::vector<Fault>;
-
-/// The members of an Invocation that describe one side of it.
-struct Role {
-    std::string name;
-    std::array<void*, 4> Invocation::*planes;
-    std::array<int, 4> Invocation::*steps;
-    bool Invocation::*arrayNull;
-    bool arrayTested;
-    int planesTested;
-};
-
-void addPointers(Faults& faults, const Side& side, const Role& role)
-{
-    if (side.arrangement == Arrangement::planar && role.arrayTested) {
-        faults.push_back({role.name + " array null", [=](Invocation& call) { call.*role.arrayNull = true; }});
-    }
-    for (int i = 0; i < role.planesTested; ++i) {
-        faults.push_back({role.name + " plane " + std::to_string(i) + " null",
-                          [=](Invocation& call) { (call.*role.planes)[i] = nullptr; }});
-    }
-}
-
-void addSteps(Faults& faults, const Side& side, const Role& role)
-{
-    const int count = side.steps == catalog::Steps::each ? side.planes : side.steps == catalog::Steps::one ? 1 : 0;
-    for (int i = 0; i < count; ++i) {
-        for (const int step : {0, -1}) {
-            faults.push_back({role.name + " step " + std::to_string(i) + " is " + std::to_string(step),
-                              [=](Invocation& call) { (call.*role.steps)[i] = step; }});
-        }
-    }
-}
-
-void addSizes(Faults& faults, const char* name, s32 RoiSize::*length, int minimum, int multiple)
-{
-    std::set<int> bad = {0, -1, std::numeric_limits<int>::min()};
-    if (minimum > 1) bad.insert({1, minimum - 1});
-    for (int rest = 1; rest < multiple; ++rest) bad.insert(2 * multiple * minimum + rest);
-    for (const int value : bad) {
-        faults.push_back(
-            {name + std::string(" is ") + std::to_string(value), [=](Invocation& call) { call.roi.*length = value; }});
-    }
-}
-
-void addParameters(Faults& faults, const Export& entry)
-{
-    for (int i = 0; i < entry.parameterCount; ++i) {
-        const catalog::Parameter& parameter = entry.traits.parameters[i];
-        const std::string name(parameter.name);
-        if (entry.parameterTypes[i].pointer && !parameter.optional && !parameter.workspace) {
-            faults.push_back({name + " null", [=](Invocation& call) { call.parameters[i].pointer = nullptr; }});
-        }
-        if (parameter.status == pyxOk) continue;
-        if (parameter.aboveFront) {
-            faults.push_back({name + " is not above what is in front of it",
-                              [=](Invocation& call) { call.parameters[i].number = call.parameters[i - 1].number; }});
-            continue;
-        }
-        const bool isUnsigned = entry.parameterTypes[i].type.starts_with('u');
-        for (const double value : {parameter.low - 1, parameter.high + 1}) {
-            if (isUnsigned && value < 0) continue;
-            if (value > std::numeric_limits<s32>::max()) continue;
-            faults.push_back(
-                {name + " is " + std::to_string(value), [=](Invocation& call) { call.parameters[i].number = value; }});
-        }
-    }
-}
-
-Faults faultsOf(const Export& entry)
-{
-    const catalog::Traits& traits = entry.traits;
-    const Role source{"source",
-                      &Invocation::source,
-                      &Invocation::sourceStep,
-                      &Invocation::sourceArrayNull,
-                      traits.untested != catalog::Untested::sourceArray,
-                      entry.source.planes};
-    const Role target{"target",
-                      &Invocation::target,
-                      &Invocation::targetStep,
-                      &Invocation::targetArrayNull,
-                      traits.untested != catalog::Untested::targetArray,
-                      entry.target.planes - (traits.untested == catalog::Untested::targetAlpha ? 1 : 0)};
-    Faults faults;
-    addPointers(faults, entry.source, source);
-    if (traits.stepsTested) addSteps(faults, entry.source, source);
-    if (!entry.inPlace) {
-        addPointers(faults, entry.target, target);
-        if (traits.stepsTested) addSteps(faults, entry.target, target);
-    }
-    addSizes(faults, "width", &RoiSize::width, traits.minimum.width, traits.minimum.widthMultiple);
-    addSizes(faults, "height", &RoiSize::height, traits.minimum.height, traits.minimum.heightMultiple);
-    addParameters(faults, entry);
-    return faults;
-}
-
-/// The status of a call on a target of its own, or what it wrote.
-Failure checkCall(const Subject& subject, catalog::Function function, const Scene& scene, const Fault& first,
-                  const Fault& second)
-{
-    const Image target = scene.target();
-    Invocation call = scene.invocation(target);
-    first.apply(call);
-    second.apply(call);
-    const PyxStatus expected = expectedStatus(*subject.entry, call);
-    const PyxStatus found = subject.entry->call(function, call);
-    if (found != expected) return "status " + std::to_string(found) + " instead of " + std::to_string(expected);
-    if (const auto difference = firstDifference(scene.target(), target)) return "something was written: " + *difference;
-    return scene.sourceDamage();
-}
-
 Failure checkBoth(const Subject& subject, const Scene& scene, const Fault& first, const Fault& second)
 {
     const std::string what = first.text + ", " + second.text + ": ";
-    if (const auto text = checkCall(subject, subject.reference, scene, first, second))
+    const Fault faults[] = {first, second};
+    if (const auto text = checkRefusal(*subject.entry, subject.reference, scene, faults))
         return what + "the reference: " + *text;
-    if (const auto text = checkCall(subject, subject.function, scene, first, second)) return what + *text;
+    if (const auto text = checkRefusal(*subject.entry, subject.function, scene, faults)) return what + *text;
     return std::nullopt;
 }
 
@@ -151,9 +23,9 @@ Failure checkBoth(const Subject& subject, const Scene& scene, const Fault& first
 
 Failure checkFaults(const Subject& subject)
 {
-    const Export& entry = *subject.entry;
+    const catalog::Export& entry = *subject.entry;
     const Scene scene(entry, {.seed = seedOf(entry.name, 0), .roi = legalSize(entry, {21, 4})});
-    const Faults faults = faultsOf(entry);
+    const std::vector<Fault> faults = faultsOf(entry);
     for (std::size_t i = 0; i < faults.size(); ++i) {
         for (std::size_t k = i; k < faults.size(); ++k) { // a fault with itself is a lone one
             if (auto text = checkBoth(subject, scene, faults[i], faults[k])) return *text + "\n  " + scene.text();

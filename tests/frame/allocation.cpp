@@ -20,14 +20,11 @@ namespace
 
 /// What the library asked of the program since the last reset.
 struct Requests {
-    std::vector<s32> sizes;
+    int failing = -1;       ///< the number of the one that fails
+    bool exhausted = false; ///< those behind it fail as well
+    std::vector<s32> sizes = {};
     int given = 0, returned = 0;
-    bool fail = false;
-    int failing = -1;             ///< which one fails, by its number, if not all do
     std::vector<void*> held = {}; ///< given and not returned yet
-
-    Requests() = default;
-    explicit Requests(bool failAll, int failOne = -1) : fail(failAll), failing(failOne) {}
 };
 
 Requests requests;
@@ -43,7 +40,8 @@ void reset(Requests next = {})
 
 void* PYXCC_CALL pyxMalloc(s32 byteCount)
 {
-    const bool failing = requests.fail || static_cast<int>(requests.sizes.size()) == requests.failing;
+    const int number = static_cast<int>(requests.sizes.size());
+    const bool failing = number == requests.failing || (requests.exhausted && number > requests.failing);
     requests.sizes.push_back(byteCount);
     if (failing || byteCount < 1) return nullptr;
     ++requests.given;
@@ -67,7 +65,30 @@ constexpr RoiSize large = {234, 117};
 /// Calls of an export for which the parameters decide whether it takes scratch memory are made with several.
 int callsOf(const catalog::Export& entry) { return entry.traits.allocates && entry.parameterCount > 0 ? 12 : 1; }
 
-/// A call with memory at hand, then with none, and then with one of the requests failing.
+/// How much of what it was given a call keeps when that request fails. Fewer levels with noise have four: two tables
+/// and two records, which are not given back when the rows of errors, the last request, cannot be had.
+int kept(const catalog::Export& entry, const catalog::Invocation& call, int failing, int requestCount)
+{
+    if (!entry.name.starts_with("pyxiReduceBits_") || entry.name == "pyxiReduceBits_8u1u_C1R") return 0;
+    const double noise = call.parameters[0].number, type = call.parameters[1].number;
+    return noise > 0 && type <= 3 && failing == requestCount - 1 ? 4 : 0;
+}
+
+/// A call of which a request fails: it tells so, has written nothing and has kept what it keeps.
+std::optional<std::string> checkFailure(const catalog::Export& entry, const Scene& scene, int failing, bool exhausted,
+                                        int requestCount)
+{
+    const Image target = scene.target();
+    const catalog::Invocation call = scene.invocation(target);
+    reset({.failing = failing, .exhausted = exhausted});
+    const PyxStatus found = entry.call(call);
+    if (found != pyxErrNoMemory) return "status " + std::to_string(found) + " without memory";
+    if (requests.given - requests.returned != kept(entry, call, failing, requestCount)) return "memory was kept";
+    if (auto text = firstDifference(scene.target(), target)) return "something was written: " + *text;
+    return scene.sourceDamage();
+}
+
+/// A call with memory at hand, and then each of its requests failing, alone and with all behind it.
 std::optional<std::string> checkCall(const Subject& subject, int number)
 {
     const catalog::Export& entry = *subject.entry;
@@ -81,15 +102,11 @@ std::optional<std::string> checkCall(const Subject& subject, int number)
     if (requests.given != requests.returned) return "scratch memory was not given back";
 
     const int count = static_cast<int>(requests.sizes.size());
-    const PyxStatus expected = allocates ? pyxErrNoMemory : expectedStatus(entry, call);
-    for (int failing = -1; failing < count; ++failing) {
-        const Image unwritten = scene.target();
-        const catalog::Invocation failingCall = scene.invocation(unwritten);
-        reset(Requests(failing < 0, failing));
-        const PyxStatus found = entry.call(failingCall);
-        if (found != expected) return "status " + std::to_string(found) + " instead of " + std::to_string(expected);
-        if (found != pyxErrNoMemory) continue;
-        if (auto text = firstDifference(scene.target(), unwritten)) return text;
+    for (int failing = 0; failing < count; ++failing) {
+        for (const bool exhausted : {false, true}) {
+            if (auto text = checkFailure(entry, scene, failing, exhausted, count))
+                return "request " + std::to_string(failing) + ": " + *text + "\n  " + scene.text();
+        }
     }
     return std::nullopt;
 }
@@ -137,7 +154,7 @@ TEST(ReduceBitsScratch, ErrorRowsThatFailLeaveTheNoiseTables)
     const u8 source = 100;
     u8 target = 7;
     for (const u32 type : {1u, 2u, 3u}) {
-        reset(Requests(false, 4));
+        reset({.failing = 4});
         EXPECT_EQ(pyxiReduceBits_8u_C1R(&source, 1, &target, 1, {1, 1}, 50, type, 2), pyxErrNoMemory);
         EXPECT_EQ(requests.given, 4);
         EXPECT_EQ(requests.returned, 0);
@@ -172,7 +189,7 @@ TEST(Scratch, ComesFromTheProgram)
 
 TEST(Scratch, FailsWhenTheProgramHasNone)
 {
-    reset(Requests(true));
+    reset({.failing = 0});
     EXPECT_FALSE(takeScratch(300));
     EXPECT_EQ(requests.sizes.size(), 1U);
     EXPECT_EQ(requests.returned, 0);

@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <limits>
 #include <type_traits>
 
 namespace reference
@@ -59,6 +60,14 @@ template <typename D> constexpr s32 topOf = std::is_same_v<D, u8> ? 255 : 65535;
 /// A level of 0 .. top as a sample.
 template <typename D> D sampleOf(s32 level) { return static_cast<D>(std::is_same_v<D, s16> ? level - 32768 : level); }
 
+/// Held to the range of the target's samples at the end. What is taken off before wraps, as all of 32 bits do.
+template <typename D> D heldSampleOf(s32 level)
+{
+    const u32 less = std::is_same_v<D, s16> ? 32768 : 0;
+    const s32 sample = static_cast<s32>(static_cast<u32>(level) - less);
+    return static_cast<D>(std::clamp<s32>(sample, std::numeric_limits<D>::min(), std::numeric_limits<D>::max()));
+}
+
 /// A quantised value as a level of the target. The half that rounds is left out but in the first diffusion, and there
 /// too in most depths.
 template <typename S, typename D> s32 levelOf(f32 v, u32 method)
@@ -101,8 +110,7 @@ template <typename S, typename D> void toNearest(const Images<S, D>& images, con
                 const f32 r = std::fma(p, levels.unit, -pr);
                 const f32 up = half < r ? iv : 0.0f;
                 const f32 value = inBody ? std::fma(q, iv, up) : pr + up;
-                const s32 level = std::clamp(truncated(value * scale), 0, topOf<D>);
-                dst[k].set(row, column, sampleOf<D>(level));
+                dst[k].set(row, column, heldSampleOf<D>(truncated(value * scale)));
             }
         }
     }

@@ -17,6 +17,8 @@ enum class Placement {
     beginAtGuard, ///< the first byte follows an unreadable page
 };
 
+inline constexpr Placement allPlacements[] = {Placement::margins, Placement::endAtGuard, Placement::beginAtGuard};
+
 std::string_view nameOf(Placement placement);
 
 class Memory

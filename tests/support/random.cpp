@@ -1,5 +1,6 @@
 #include "support/random.hpp"
 
+#include <algorithm>
 #include <cstring>
 
 namespace support
@@ -13,15 +14,30 @@ std::uint64_t Random::next()
     return z ^ (z >> 31);
 }
 
+/// A number of so many bytes of the script, or one of the generator.
+std::uint64_t Random::choose(int byteCount)
+{
+    if (script_.empty()) return next();
+    std::uint64_t number = 0;
+    for (; byteCount > 0 && !script_.empty(); --byteCount) {
+        number = number << 8 | script_.front();
+        script_ = script_.subspan(1);
+    }
+    return number;
+}
+
 int Random::between(int low, int high)
 {
     const auto count = static_cast<std::uint64_t>(static_cast<std::int64_t>(high) - low + 1);
-    return static_cast<int>(low + static_cast<std::int64_t>(next() % count));
+    const std::uint64_t number = choose(count <= 0x100 ? 1 : count <= 0x10000 ? 2 : 4);
+    return static_cast<int>(low + static_cast<std::int64_t>(number % count));
 }
 
 double Random::real(double low, double high)
 {
-    const double unit = static_cast<double>(next() >> 11) * 0x1p-53;
+    const bool scripted = !script_.empty();
+    const std::uint64_t number = choose(3);
+    const double unit = scripted ? static_cast<double>(number) / 0xffffff : static_cast<double>(number >> 11) * 0x1p-53;
     return low + unit * (high - low);
 }
 
@@ -33,6 +49,14 @@ void Random::fill(std::span<u8> bytes)
         std::memcpy(bytes.data(), &word, count);
         bytes = bytes.subspan(count);
     }
+}
+
+void Random::read(std::span<u8> bytes)
+{
+    const std::size_t count = std::min(bytes.size(), script_.size());
+    std::copy_n(script_.begin(), count, bytes.begin());
+    script_ = script_.subspan(count);
+    fill(bytes.subspan(count));
 }
 
 std::uint64_t seedOf(std::string_view subject, int number)

@@ -10,11 +10,11 @@
 namespace support
 {
 
-/// The SplitMix64 generator.
+/// The SplitMix64 generator. Choices are made by the bytes of a script first, as long as there are any.
 class Random
 {
 public:
-    explicit Random(std::uint64_t seed) : state_(seed) {}
+    explicit Random(std::uint64_t seed, std::span<const u8> script = {}) : state_(seed), script_(script) {}
 
     std::uint64_t next();
 
@@ -30,10 +30,20 @@ public:
         return choices[between(0, static_cast<int>(std::size(choices)) - 1)];
     }
 
+    /// Any bytes, none of which is of the script.
     void fill(std::span<u8> bytes);
 
+    /// Bytes of the script, and then any.
+    void read(std::span<u8> bytes);
+
+    /// What is left of the script.
+    std::span<const u8> script() const { return script_; }
+
 private:
+    std::uint64_t choose(int byteCount);
+
     std::uint64_t state_;
+    std::span<const u8> script_;
 };
 
 /// A seed for the case of that number in a test on that subject.

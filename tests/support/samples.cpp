@@ -62,6 +62,7 @@ public:
             return value_;
         case Pattern::random:
         case Pattern::gray:
+        case Pattern::bytes:
             break;
         }
         return random_.real(limits_.low, limits_.high);
@@ -87,6 +88,10 @@ void fillPlane(const Plane& plane, int samplesAPixel, Range range, Pattern patte
     double value = 0;
     for (int y = 0; y < shape.rows; ++y) {
         const auto row = plane.row(y);
+        if (pattern == Pattern::bytes) {
+            random.read(row);
+            continue;
+        }
         for (int x = 0; x < shape.rowBytes / size; ++x) {
             if (x % repeat == 0) value = generator.next();
             store(element, row.data() + x * size, isFloat(element) ? value : std::round(value));
@@ -98,7 +103,7 @@ void fillPlane(const Plane& plane, int samplesAPixel, Range range, Pattern patte
 
 std::string_view nameOf(Pattern pattern)
 {
-    constexpr std::string_view names[] = {"random", "extremes", "ramp", "flat", "gray"};
+    constexpr std::string_view names[] = {"random", "extremes", "ramp", "flat", "gray", "any"};
     return names[static_cast<int>(pattern)];
 }
 

@@ -13,10 +13,12 @@ enum class Pattern {
     ramp,     ///< rising by a constant, and starting again
     flat,     ///< one value a plane
     gray,     ///< all samples of a pixel are equal
+    bytes,    ///< any bit patterns, not a number and infinities among them
 };
 
 std::string_view nameOf(Pattern pattern);
 
+/// Those that keep to the range of an export's samples.
 inline constexpr Pattern allPatterns[] = {Pattern::random, Pattern::extremes, Pattern::ramp, Pattern::flat,
                                           Pattern::gray};
 

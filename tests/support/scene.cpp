@@ -75,6 +75,7 @@ std::vector<Geometry> geometriesOf(const Side& side, RoiSize roi, Stride stride,
                          : side.steps == Steps::none ? shape.rowBytes
                                                      : common;
         Geometry& geometry = geometries.emplace_back(geometryOf(shape, side.element, step & -side.stepUnit));
+        geometry.low &= -std::ptrdiff_t{side.rowUnit};
         const bool luma = plane == 0;
         addRows(geometry, luma ? beyond.lumaInFront : beyond.chromaInFront, luma ? 0 : beyond.chromaBehind);
     }
@@ -167,7 +168,7 @@ RoiSize legalSize(const Export& entry, RoiSize roi)
 
 Scene::Scene(const Export& entry, const Recipe& recipe) : entry_(entry), recipe_(recipe)
 {
-    Random random(recipe.seed);
+    Random random(recipe.seed, recipe.script);
     makeParameters(random);
     makeImages(random);
 }

@@ -30,7 +30,8 @@ struct Recipe {
     Placement placement = Placement::margins;
     Stride sourceStride = Stride::tight;
     Stride targetStride = Stride::tight;
-    bool aligned = false; ///< all planes begin at multiples of 64
+    bool aligned = false;            ///< all planes begin at multiples of 64
+    std::span<const u8> script = {}; ///< makes the choices, and the samples, as far as it goes
 };
 
 /// The strides that an export accepts.

@@ -1,0 +1,66 @@
+// The scripts that the fuzzer has kept.
+#include "fuzz/scripted_call.hpp"
+#include "reference/reference.hpp"
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+#include <set>
+#include <vector>
+
+namespace
+{
+
+std::vector<std::vector<u8>> corpus()
+{
+    std::vector<std::vector<u8>> scripts;
+    for (const auto& entry : std::filesystem::directory_iterator(CORPUS)) {
+        std::ifstream file(entry.path(), std::ios::binary);
+        scripts.emplace_back(std::istreambuf_iterator<char>(file), std::istreambuf_iterator<char>());
+    }
+    return scripts;
+}
+
+TEST(Corpus, LibraryAndReferenceAgree)
+{
+    const auto scripts = corpus();
+    EXPECT_GT(scripts.size(), 100U);
+    for (const auto& script : scripts) EXPECT_EQ(fuzz::checkScript(script).value_or(""), "");
+}
+
+PyxStatus wrongLastColumn(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
+{
+    const PyxStatus status = reference::pyxiRGBToYCbCr_8u_C3R(src, srcStep, dst, dstStep, roi);
+    if (status == pyxOk) dst[3 * roi.width - 1] ^= 1;
+    return status;
+}
+
+PyxStatus writesWithoutTests(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
+{
+    if (src && dst) dst[0] ^= 1;
+    return reference::pyxiRGBToYCbCr_8u_C3R(src, srcStep, dst, dstStep, roi);
+}
+
+/// How many of the scripts find something wrong with a function in the place of the library's.
+int findings(PyxStatus (*function)(const u8*, int, u8*, int, RoiSize), const std::vector<std::vector<u8>>& scripts)
+{
+    const auto subject = support::substitute("pyxiRGBToYCbCr_8u_C3R", reinterpret_cast<catalog::Function>(function));
+    int count = 0;
+    for (const auto& script : scripts) count += fuzz::checkScript(subject, script).has_value();
+    return count;
+}
+
+TEST(Corpus, FindsWhatIsWrong)
+{
+    std::vector<std::vector<u8>> scripts;
+    for (int first = 0; first < 8; ++first) { // every eighth has faults
+        for (u8 second = 0; second < 20; ++second) scripts.push_back({static_cast<u8>(first), second, 5, 5, 5});
+    }
+    EXPECT_EQ(findings(&reference::pyxiRGBToYCbCr_8u_C3R, scripts), 0);
+    EXPECT_EQ(findings(wrongLastColumn, scripts), 140);
+    EXPECT_EQ(findings(writesWithoutTests, scripts), 20); // those of a wrong height
+}
+
+} // namespace
