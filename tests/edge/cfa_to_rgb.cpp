@@ -50,6 +50,16 @@ TEST(CfaToRgb, FourSamplesAreAllCorners)
               (Words{1000, 2501, 4000, 1000, 2000, 4000, 1000, 3001, 4000, 1000, 2501, 4000}));
 }
 
+// One column and one row are both the second and the last but one. Red is at the corners and blue, 99, in the middle;
+// of the middle green is (21 + 85 + 40 + 64 + 2) >> 2 and red (10 + 33 + 70 + 201 + 2) >> 2.
+TEST(CfaToRgb, ThreeColumnsAndRowsHaveOneAmidTheFrame)
+{
+    EXPECT_EQ(converted(Bytes{10, 21, 33, 40, 99, 64, 70, 85, 201}, {3, 3}, 1),
+              (Bytes{10, 31, 99, 22,  21, 99, 33,  43, 99, //
+                     40, 40, 99, 79,  53, 99, 117, 64, 99, //
+                     70, 63, 99, 136, 85, 99, 201, 75, 99}));
+}
+
 TEST(CfaToRgb, OneColourIsThatColourEverywhere)
 {
     for (s32 grid = 0; grid < 4; ++grid) {

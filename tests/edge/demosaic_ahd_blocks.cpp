@@ -143,6 +143,25 @@ TEST(DemosaicAhdBlocks, AtAWidthOfFiveTheMirrorReachesBeyondTheRow)
     EXPECT_NE(alike.samples, other.samples);
 }
 
+TEST(DemosaicAhdBlocks, AtAWidthOfSixTheStripOnTheRightStands)
+{
+    // It begins at column 1 and the one on the left ends with column 4. Regions of the first column alone and of all
+    // but the first show each by itself; the former is written as far as the strip goes.
+    const Mosaic mosaic(6, 30, noise);
+    Target both, left, right;
+    EXPECT_EQ(mosaic.convert({0, 0, 6, 30}, bggr, both), pyxOk);
+    EXPECT_EQ(mosaic.convert({0, 0, 1, 30}, bggr, left), pyxOk);
+    EXPECT_EQ(mosaic.convert({1, 0, 5, 30}, bggr, right), pyxOk);
+    const auto columns = [](Target& target, int from, int to) {
+        Samples pixels;
+        for (int y = 5; y < 25; ++y) pixels.insert(pixels.end(), target.pixel(from, y), target.pixel(to, y));
+        return pixels;
+    };
+    EXPECT_EQ(columns(both, 0, 1), columns(left, 0, 1));
+    EXPECT_EQ(columns(both, 1, 6), columns(right, 0, 5));
+    EXPECT_NE(columns(both, 1, 5), columns(left, 1, 5));
+}
+
 TEST(DemosaicAhdBlocks, OddStepsOfWordsMoveBlocksByWholeSamplesOnly)
 {
     // The inside of 14 by 14 is at (5, 5). Rows of the top strip are 121 bytes apart, but the inside begins 5 rows of

@@ -90,6 +90,7 @@ TEST(Repack, NoRowsAreNoErrorWhereTheHeightIsNotTested)
     const int steps[3] = {4, 2, 2};
     for (const int height : {0, -1}) {
         EXPECT_EQ(pyxiYCbCr411ToYCbCr422_8u_P3R(src, steps, dst, steps, {4, height}), pyxOk);
+        EXPECT_EQ(pyxiYCbCr411ToYCbCr422_8u_P3C2R(src, steps, target.data(), 8, {4, height}), pyxOk);
         EXPECT_EQ(pyxiYCbCr422ToYCrCb422_8u_C2R(samples, 4, target.data(), 4, {2, height}), pyxOk);
         EXPECT_EQ(pyxiYCbCr411_8u_P2P3R(samples, 4, samples, 2, dst, steps, {4, height}), pyxOk);
         EXPECT_EQ(pyxiYCbCr422ToYCbCr411_8u_C2P3R(samples, 8, dst, steps, {4, height}), pyxErrSize);
