@@ -4,21 +4,22 @@
 
 #include <gtest/gtest.h>
 
-#include <filesystem>
 #include <fstream>
-#include <iterator>
-#include <set>
+#include <string>
 #include <vector>
 
 namespace
 {
 
+/// A script a line, two hexadecimal digits a byte.
 std::vector<std::vector<u8>> corpus()
 {
     std::vector<std::vector<u8>> scripts;
-    for (const auto& entry : std::filesystem::directory_iterator(CORPUS)) {
-        std::ifstream file(entry.path(), std::ios::binary);
-        scripts.emplace_back(std::istreambuf_iterator<char>(file), std::istreambuf_iterator<char>());
+    std::ifstream file(CORPUS);
+    for (std::string line; std::getline(file, line);) {
+        std::vector<u8>& script = scripts.emplace_back();
+        for (std::size_t i = 0; i + 1 < line.size(); i += 2)
+            script.push_back(static_cast<u8>(std::stoi(line.substr(i, 2), nullptr, 16)));
     }
     return scripts;
 }
@@ -26,7 +27,7 @@ std::vector<std::vector<u8>> corpus()
 TEST(Corpus, LibraryAndReferenceAgree)
 {
     const auto scripts = corpus();
-    EXPECT_GT(scripts.size(), 100U);
+    EXPECT_GE(scripts.size(), catalog::exports().size()); // of each there is a call at the least
     for (const auto& script : scripts) EXPECT_EQ(fuzz::checkScript(script).value_or(""), "");
 }
 
