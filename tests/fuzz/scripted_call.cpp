@@ -12,6 +12,12 @@ using namespace support;
 namespace
 {
 
+const Subject& choose(Random& random)
+{
+    const auto all = subjects();
+    return all[random.between(0, static_cast<int>(all.size()) - 1)];
+}
+
 /// Small as a rule, so that many calls can be made; now and then beyond the sizes at which a table pays.
 RoiSize sizeOf(Random& random)
 {
@@ -63,9 +69,14 @@ std::optional<std::string> checkScript(const Subject& subject, std::span<const u
 std::optional<std::string> checkScript(std::span<const u8> script)
 {
     Random random(0, script);
-    const auto all = subjects();
-    const Subject& subject = all[random.between(0, static_cast<int>(all.size()) - 1)];
+    const Subject& subject = choose(random);
     return checkScript(subject, random.script());
+}
+
+const Subject& subjectOf(std::span<const u8> script)
+{
+    Random random(0, script);
+    return choose(random);
 }
 
 } // namespace fuzz

@@ -10,6 +10,9 @@
 namespace fuzz
 {
 
+/// The export that a script calls.
+const support::Subject& subjectOf(std::span<const u8> script);
+
 /// Makes the call with the library and with the reference. Tells in what they differ, or what was touched that must not
 /// be; nothing if all is well.
 std::optional<std::string> checkScript(std::span<const u8> script);
