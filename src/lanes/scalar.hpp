@@ -133,7 +133,9 @@ inline F64 whereLess(F64 x, F64 y, F64 yes, F64 no) { return x.v < y.v ? yes : n
 inline F32 whereLess(F32 x, F32 y, F32 yes, F32 no) { return x.v < y.v ? yes : no; }
 inline F32 whereAtMost(F32 x, F32 y, F32 yes, F32 no) { return x.v <= y.v ? yes : no; }
 inline F32 whereEqual(F32 x, F32 y, F32 yes, F32 no) { return x.v == y.v ? yes : no; }
+inline F32 zeroWhereLess(F32 x, F32 y, F32 z) { return x.v < y.v ? F32(0.0f) : z; }
 inline F32 whereSigned(F32 x, F32 yes, F32 no) { return std::signbit(x.v) ? yes : no; }
+inline bool anyAtMost(F32 x, F32 y) { return x.v <= y.v; }
 inline F32 magnitude(F32 x) { return std::fabs(x.v); }
 inline S32 whereEqual(F32 x, F32 y, S32 yes, S32 no) { return x.v == y.v ? yes : no; }
 
@@ -142,6 +144,9 @@ inline F64 sqrt(F64 x) { return std::sqrt(x.v); }
 inline F32 toF32(S32 x) { return static_cast<f32>(x.v); }
 inline F32 toF32(F64 x) { return static_cast<f32>(x.v); }
 inline F64 toF64(F32 x) { return x.v; }
+
+/// Sign, exponent, and the first bit of the mantissa.
+inline S32 halfOctave(F32 x) { return std::bit_cast<s32>(x.v) >> 22; }
 
 /// Sign, exponent, and 20 bits of the mantissa.
 inline S32 upperWords(F64 x) { return static_cast<s32>(std::bit_cast<std::uint64_t>(x.v) >> 32); }
@@ -160,6 +165,9 @@ inline S32 trunc(F32 x) { return x.v >= -0x1p31f && x.v < 0x1p31f ? static_cast<
 inline S32 trunc(F64 x) { return x.v > -0x1p31 - 1 && x.v < 0x1p31 ? static_cast<s32>(x.v) : INT32_MIN; }
 inline F64 doublesBeside(F32, f64 k) { return k; }
 inline S32 nearest(F32 x) { return trunc(F32(std::nearbyint(x.v))); }
+
+/// Whether the mode in force is to round to the nearest.
+inline bool roundsToNearest() { return nearest(0.5f).v == 0 && nearest(1.5f).v == 2; }
 
 /// Clamps an integer at both ends of a sample's range.
 template <std::integral Sample> Sample saturate(S32 x)
@@ -238,7 +246,7 @@ template <class T> Lane<T> exceptWhere(Lane<T> mask, Lane<T> x) { return mask.v 
 
 inline U8 lookUp(const std::array<u8, 16>& table, U8 index) { return table[index.v]; }
 inline U16 lookUp(const std::array<u8, 16>& masks, U16 index) { return masks[index.v] * 0x0101; }
-inline F32 lookUp(const std::array<f32, 8>& table, S32 index) { return table[static_cast<u32>(index.v)]; }
+inline F32 lookUp(const std::array<f32, 8>& table, S32 index) { return table[static_cast<u32>(index.v) % 8]; }
 
 inline F32 whereOdd(S32 x, F32 yes, F32 no) { return x.v % 2 != 0 ? yes : no; }
 

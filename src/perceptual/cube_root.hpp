@@ -12,12 +12,23 @@ template <class F32> struct RootStart {
     F32 y; ///< a root near by
 };
 
+template <class F32> PYXCC_INLINE RootStart<F32> rootStart(const Two<F32>& row, const F32& v)
+{
+    const F32 y = row.a;
+    return {fused(-(y * y), y, v) * row.b, y};
+}
+
 template <class F32, class Index>
 PYXCC_INLINE RootStart<F32> rootStart(const CubeRootTable& table, const Index& index, const F32& v)
 {
-    const auto row = lookUp(table, index);
-    const F32 y = row.a;
-    return {fused(-(y * y), y, v) * row.b, y};
+    return rootStart(lookUp(table, index), v);
+}
+
+/// For what comes of integer samples: no sum of theirs is beyond the table.
+template <class F32, class Index>
+PYXCC_INLINE RootStart<F32> rootStartWithin(const CubeRootTable& table, const Index& index, const F32& v)
+{
+    return rootStart(lookUpWithin(table, index), v);
 }
 
 /// Each operation by itself.

@@ -77,7 +77,7 @@ PYXCC_INLINE F32 whereOdd(S32 x, F32 yes, F32 no)
     return whereSigned(F32(_mm256_castsi256_ps((x << 31).v)), yes, no);
 }
 
-/// Entries of a table; an index is below 8.
+/// Entries of a table by the last three bits of an index.
 PYXCC_INLINE F32 lookUp(const std::array<f32, 8>& table, S32 index)
 {
     return F32(_mm256_permutevar8x32_ps(_mm256_loadu_ps(table.data()), index.v));

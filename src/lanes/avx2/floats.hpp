@@ -49,11 +49,23 @@ PYXCC_INLINE F32 whereLess(F32 x, F32 y, F32 yes, F32 no) { return F32(x.v < y.v
 PYXCC_INLINE F32 whereAtMost(F32 x, F32 y, F32 yes, F32 no) { return F32(x.v <= y.v ? yes.v : no.v); }
 PYXCC_INLINE F32 whereEqual(F32 x, F32 y, F32 yes, F32 no) { return F32(x.v == y.v ? yes.v : no.v); }
 
+/// x < y ? 0 : z.
+PYXCC_INLINE F32 zeroWhereLess(F32 x, F32 y, F32 z)
+{
+    return F32(_mm256_andnot_ps(_mm256_cmp_ps(x.v, y.v, _CMP_LT_OQ), z.v));
+}
+
+/// Whether x <= y in any lane.
+PYXCC_INLINE bool anyAtMost(F32 x, F32 y) { return _mm256_movemask_ps(_mm256_cmp_ps(x.v, y.v, _CMP_LE_OQ)) != 0; }
+
 /// By the sign bit, which a zero can have as well.
 PYXCC_INLINE F32 whereSigned(F32 x, F32 yes, F32 no) { return F32(_mm256_blendv_ps(no.v, yes.v, x.v)); }
 
 /// Without its sign.
 PYXCC_INLINE F32 magnitude(F32 x) { return F32(_mm256_andnot_ps(_mm256_set1_ps(-0.f), x.v)); }
+
+/// Sign, exponent, and the first bit of the mantissa.
+PYXCC_INLINE S32 halfOctave(F32 x) { return S32(_mm256_castps_si256(x.v)) >> 22; }
 
 PYXCC_INLINE F32 toF32(S32 x) { return F32(_mm256_cvtepi32_ps(x.v)); }
 

@@ -1,4 +1,4 @@
-// Look-ups in a table whose rows are two floats: one load brings both.
+// Look-ups in a table whose rows are two floats.
 #pragma once
 
 #include "lanes/avx2/floats.hpp"
@@ -21,24 +21,42 @@ template <std::size_t Rows> Two<F32> lookUp(const PairsOfFloats<Rows>& table, S3
     return {row.a, row.b};
 }
 
+/// The same for an index that has a row.
+template <std::size_t Rows> Two<F32> lookUpWithin(const PairsOfFloats<Rows>& table, S32 index)
+{
+    return lookUp(table, index);
+}
+
 } // namespace scalar
 
 namespace wide
 {
 
+namespace detail
+{
+
+/// The floats at `stride` times each index. The gather writes into a register that holds nothing: as the compiler would
+/// have it, it would wait for what the register held before.
+template <int stride> PYXCC_INLINE F32 gather(const f32* floats, S32 index)
+{
+    __m256 all = _mm256_castsi256_ps(_mm256_set1_epi32(-1));
+    asm("" : "+x"(all)); // else the compiler knows that all lanes are written
+    return F32(_mm256_mask_i32gather_ps(_mm256_setzero_ps(), floats, index.v, all, stride * int{sizeof(f32)}));
+}
+
+} // namespace detail
+
+/// Two gathers of floats, which are less work than gathers of rows and the shuffles behind them.
+template <std::size_t Rows> PYXCC_INLINE Two<F32> lookUpWithin(const PairsOfFloats<Rows>& table, S32 index)
+{
+    const f32* const floats = &table[0].a;
+    return {detail::gather<2>(floats, index), detail::gather<2>(floats + 1, index)};
+}
+
 template <std::size_t Rows> PYXCC_INLINE Two<F32> lookUp(const PairsOfFloats<Rows>& table, S32 index)
 {
-    const __m256i bounded =
-        _mm256_min_epi32(_mm256_max_epi32(index.v, _mm256_setzero_si256()), _mm256_set1_epi32(Rows - 1));
-    const __m128i low = _mm256_castsi256_si128(bounded), high = _mm256_extracti128_si256(bounded, 1);
-    const auto rows = [&table](__m128i at) PYXCC_INLINE_LAMBDA {
-        const auto* const first = reinterpret_cast<const double*>(table.data());
-        const __m256d all = _mm256_castsi256_pd(_mm256_set1_epi64x(-1));
-        return _mm256_castpd_ps(_mm256_mask_i32gather_pd(_mm256_setzero_pd(), first, at, all, 8));
-    };
-    // Rows 0 1 4 5 and 2 3 6 7, so that they come into order within the halves of a register.
-    const __m256 even = rows(_mm_unpacklo_epi64(low, high)), odd = rows(_mm_unpackhi_epi64(low, high));
-    return {F32(_mm256_shuffle_ps(even, odd, 0x88)), F32(_mm256_shuffle_ps(even, odd, 0xdd))};
+    const __m256i last = _mm256_set1_epi32(Rows - 1);
+    return lookUpWithin(table, S32(_mm256_min_epi32(_mm256_max_epi32(index.v, _mm256_setzero_si256()), last)));
 }
 
 } // namespace wide
