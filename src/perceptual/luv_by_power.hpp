@@ -9,24 +9,20 @@ namespace pyxcc::perceptual
 /// Y^p for the float next to 1/3 as the exponent, p = 1/3 + 2^-25 / 3, with Y up to 1, from where L is no line. It is
 /// as good as a power of doubles narrowed to a float: the bytes that come of it are the same for all pixels.
 ///
-/// The cube root comes from the table to five digits, and one more step in doubles gets it to twice that and more. What
-/// p has over 1/3 shows in the last bit of a float: it is its share of log Y, of which four digits do.
+/// The cube root s comes from the table to five digits. One step more gets it to twice that, as long as the cube is
+/// known to more digits than a float has: its square is a sum of two. What p has over 1/3 shows in the last bit: it
+/// makes s (1 + 2^-25 log s) of s, where two digits of the logarithm do.
 template <class F32> PYXCC_INLINE F32 powerOfAThird(const F32& Y)
 {
-    const auto root = rootByEightTerms(rootStart(labCubeRootTable, trunc(Y * 127.998046875f), Y), luvLastTerms);
-    const auto s = toF64(root), y = toF64(Y);
-
-    const auto bits = upperWords(y) - (1023 << 20);
-    const F32 m = toF32(bits & 0xfffff) * 0x1p-20f;
-    const F32 ofMantissa =
-        fused(fused(fused(fused(F32(0.05866494f), m, F32(-0.22510303f)), m, F32(0.44059903f)), m, F32(-0.71671466f)), m,
-              F32(1.4426039f));
-    const F32 log2 = fused(m, ofMantissa, toF32(bits >> 20));
-    const auto excess = toF64(log2 * 6.8857986e-9f); // log 2 times 2^-25 / 3
-
-    // With Y = s^3 (1 + 3 e), the root is about s (1 + e - e^2).
-    const auto e = (y - s * s * s) * toF64(F32(0.33333334f) / Y);
-    return toF32(fused(s, fused(-e, e, e) + excess, s));
+    const F32 s = rootByEightTerms(rootStartWithin(labCubeRootTable, trunc(Y * 127.998046875f), Y), luvLastTerms);
+    const F32 square = s * s, squareRest = fused(s, s, -square);
+    const F32 overCube = fused(-squareRest, s, fused(-square, s, Y));
+    const F32 logarithm =
+        fused(fused(fused(fused(fused(F32(5.415697f), s, F32(-19.54048f)), s, F32(28.6318f)), s, F32(-22.32311f)), s,
+                    F32(10.91411f)),
+              s, F32(-3.097004f));
+    const F32 step = (overCube * refinedByFused(square)) * 0.33333334f;
+    return s + fused(s * logarithm, F32(0x1p-25f), step);
 }
 
 /// Each step as in the formula; integers are cut.

@@ -39,6 +39,13 @@ template <class F32> PYXCC_INLINE LuvChroma<F32> luvChromaInBlocks(const F32& X,
     return luvChroma(X, Y, whereEqual(D, F32(0.0f), D + 3.0f, D));
 }
 
+/// In blocks of integer samples: of black the denominator may be anything but 0, as X and Y are 0, and of nothing else
+/// is it below a hundredth.
+template <class F32> PYXCC_INLINE LuvChroma<F32> luvChromaOfSamples(const F32& X, const F32& Y, const F32& Z)
+{
+    return luvChroma(X, Y, greater(luvDenominator(X, Y, Z), F32(0.001f)));
+}
+
 /// Behind them: black is where Z is 0.
 template <class F32>
 PYXCC_INLINE LuvChroma<F32> luvChromaBehindBlocks(const F32& X, const F32& Y, const F32& Z, const F32& D)
@@ -46,6 +53,13 @@ PYXCC_INLINE LuvChroma<F32> luvChromaBehindBlocks(const F32& X, const F32& Y, co
     const F32 w = refined(D), zero = 0.0f;
     const F32 up = whereEqual(Z, zero, zero, (X * 4.0f) * w), vp = whereEqual(Z, zero, zero, (Y * 9.0f) * w);
     return {up - un, vp - vn};
+}
+
+/// L in blocks, where it is a line up to a limit of Y: most blocks have nothing so dark, and are spared the choice.
+template <class F32>
+PYXCC_INLINE F32 lightnessInBlocks(const F32& Y, const F32& limit, const F32& onLine, const F32& onCurve)
+{
+    return anyAtMost(Y, limit) ? whereAtMost(Y, limit, onLine, onCurve) : onCurve;
 }
 
 /// Floats. The rows of the table up to 1 are counted as 128, or as a little less.
@@ -58,7 +72,7 @@ struct RgbToLuvOfFloats : frame::OnFloats {
     {
         const auto [X, Y, Z] = multiplied<FusedSums>(xyzOfRgb, R, G, B);
         const F32 root = rootByEightTerms(rootStart(luvCubeRootTable, trunc(Y * rowsToOne), Y), luvLastTerms);
-        const F32 L = whereAtMost(Y, F32(luvLimit), Y * 903.3f, fused(F32(116.0f), root, F32(-16.0f)));
+        const F32 L = lightnessInBlocks(Y, F32(luvLimit), Y * 903.3f, fused(F32(116.0f), root, F32(-16.0f)));
         const LuvChroma<F32> chroma = luvChromaInBlocks(X, Y, Z);
         const F32 scale = L * 13.0f;
         return {L, chroma.u * scale, scale * chroma.v};
@@ -83,10 +97,9 @@ struct RgbToLuvOfBytes : frame::OnFloats {
     {
         const f32 unit = 0.003921569f;
         const auto [X, Y, Z] = multiplied<FusedSums>(xyzOfRgb, R * unit, G * unit, B * unit);
-        const F32 root = rootByFourTerms(rootStart(labCubeRootTable, trunc(Y * 127.998046875f), Y));
-        const F32 L = whereAtMost(Y, F32(luvLimit), Y * 903.3f, fused(F32(116.0f), root, F32(-16.0f)));
-        const F32 D = luvDenominator(X, Y, Z);
-        const LuvChroma<F32> chroma = luvChroma(X, Y, whereAtMost(D, F32(0.0f), D + 3.0f, D));
+        const F32 root = rootByFourTerms(rootStartWithin(labCubeRootTable, trunc(Y * 127.998046875f), Y));
+        const F32 L = lightnessInBlocks(Y, F32(luvLimit), Y * 903.3f, fused(F32(116.0f), root, F32(-16.0f)));
+        const LuvChroma<F32> chroma = luvChromaOfSamples(X, Y, Z);
         const F32 scale = L * 13.0f;
         return Three{nearest(L * 2.55f), nearest(fused(chroma.u, scale, F32(134.0f)) * 0.720339f),
                      nearest(fused(scale, chroma.v, F32(140.0f)) * 0.9732825f)};
@@ -107,9 +120,9 @@ struct RgbToLuvOfWords : frame::OnFloats {
     {
         const auto [X, Y, Z] = multiplied<FusedSums>(xyzOfRgb, R, G, B);
         const F32 y = Y * wordUnit;
-        const F32 root = rootBySixTerms(rootStart(luvCubeRootTable, trunc(Y) >> 9, y));
-        const F32 L = whereAtMost(Y, F32(luvLimitOfWords), y * 903.3f, root * 116.0f - 16.0f);
-        const LuvChroma<F32> chroma = luvChromaInBlocks(X, Y, Z);
+        const F32 root = rootBySixTerms(rootStartWithin(luvCubeRootTable, trunc(Y) >> 9, y));
+        const F32 L = lightnessInBlocks(Y, F32(luvLimitOfWords), y * 903.3f, root * 116.0f - 16.0f);
+        const LuvChroma<F32> chroma = luvChromaOfSamples(X, Y, Z);
         const F32 scale = L * 13.0f;
         const auto [l, u, v] = scaledToWords(L, chroma.u * scale, scale * chroma.v);
         return Three{nearest(l), nearest(u), nearest(v)};

@@ -16,14 +16,14 @@ template <class F32> PYXCC_INLINE F32 cubed(const F32& f) { return f * (f * f); 
 
 template <class F32> PYXCC_INLINE Three<F32> whereVisible(const F32& L, const Three<F32>& rgb)
 {
-    const F32 black = blackLuv, zero = 0.0f;
-    return {whereLess(L, black, zero, rgb.a), whereLess(L, black, zero, rgb.b), whereLess(L, black, zero, rgb.c)};
+    const F32 black = blackLuv;
+    return {zeroWhereLess(L, black, rgb.a), zeroWhereLess(L, black, rgb.b), zeroWhereLess(L, black, rgb.c)};
 }
 
 /// v' is kept off zero, which it is divided by.
 template <class F32> PYXCC_INLINE F32 offZero(const F32& v)
 {
-    return whereAtMost(magnitude(v), F32(nearZeroChroma), v + blackLuv, v);
+    return v + whereAtMost(magnitude(v), F32(nearZeroChroma), F32(blackLuv), F32(0.0f));
 }
 
 /// In blocks, with refined reciprocals. fL is the root of Y by L.
@@ -40,11 +40,8 @@ template <class F32> PYXCC_INLINE Three<F32> luvToRgbInBlocks(const F32& L, cons
     return multiplied<FusedSums>(rgbOfXyz, X, Y, Z);
 }
 
-template <class F32> PYXCC_INLINE F32 between0And1(const F32& x)
-{
-    const F32 zero = 0.0f, one = 1.0f;
-    return whereLess(x, zero, zero, whereLess(one, x, one, x));
-}
+/// A NaN stays one.
+template <class F32> PYXCC_INLINE F32 between0And1(const F32& x) { return greater(F32(0.0f), lesser(F32(1.0f), x)); }
 template <class F32> PYXCC_INLINE Three<F32> between0And1(const Three<F32>& x)
 {
     return {between0And1(x.a), between0And1(x.b), between0And1(x.c)};
@@ -136,7 +133,7 @@ template <int Full> struct LuvToRgbTail : frame::OnFloats {
         const F32 G = fused(Z, F32(0.041556f), fused(Y, F32(1.875991f), half + X * -0.969256f));
         const F32 b = fused(X, F32(0.055648f), -(Y * 0.204043f));
         const auto [r, g, ofXY] = whereVisible(L, Three<F32>{R, G, b});
-        const F32 ofZ = whereLess(L, F32(blackLuv), F32(0.0f), Z);
+        const F32 ofZ = zeroWhereLess(L, F32(blackLuv), Z);
         const auto B = fused(toF64(ofZ), doublesBeside(Z, 1.057311), toF64(ofXY)) + doublesBeside(Z, 0.5);
         return Three{trunc(r), trunc(g), trunc(B)};
     }
