@@ -4,6 +4,7 @@
 
 #include "frame/float_forms.hpp"
 #include "perceptual/cube_root.hpp"
+#include "perceptual/smooth_root.hpp"
 #include "perceptual/xyz_of_rgb.hpp"
 
 namespace pyxcc::perceptual
@@ -16,15 +17,17 @@ inline constexpr f32 labRowsToOne = 127.998046875f;
 inline constexpr LastTerms labLastTermsOfFloats = {0.019001169f, 0.015834307f};
 inline constexpr LastTerms labLastTermsOfWords = {0.0190012f, 0.0158343f};
 
+template <class F32> PYXCC_INLINE auto labRow(const F32& v) { return trunc(v * labRowsToOne); }
+
 // What differs by depth: how samples come to the white point, the cube root, and what is stored of L, a and b in blocks
 // (with fused sums) and behind them. `a` and `b` come as the differences that they are multiples of.
 
 struct LabOfFloats {
     static constexpr Weights white = {1.0521265f, 1.0f, 0.91848117f};
 
-    template <class F32> static PYXCC_INLINE F32 root(const RootStart<F32>& start)
+    template <class F32> static PYXCC_INLINE F32 root(const F32& v)
     {
-        return rootByEightTerms(start, labLastTermsOfFloats);
+        return rootByEightTerms(rootStart(labCubeRootTable, labRow(v), v), labLastTermsOfFloats);
     }
     template <class Sums, class F32> static PYXCC_INLINE Three<F32> stored(const F32& L, const F32& a, const F32& b)
     {
@@ -35,7 +38,10 @@ struct LabOfFloats {
 struct LabOfBytes {
     static constexpr Weights white = {0.0041259914f, 0.003921569f, 0.0036018905f};
 
-    template <class F32> static PYXCC_INLINE F32 root(const RootStart<F32>& start) { return rootByFourTerms(start); }
+    template <class F32> static PYXCC_INLINE F32 root(const F32& v)
+    {
+        return rootByFourTerms(rootStartWithin(labCubeRootTable, labRow(v), v));
+    }
 
     template <class Sums, class F32> static PYXCC_INLINE auto stored(const F32& L, const F32& a, const F32& b)
     {
@@ -48,9 +54,9 @@ struct LabOfBytes {
 struct LabOfWords {
     static constexpr Weights white = LabOfBytes::white;
 
-    template <class F32> static PYXCC_INLINE F32 root(const RootStart<F32>& start)
+    template <class F32> static PYXCC_INLINE F32 root(const F32& v)
     {
-        return rootByEightTerms(start, labLastTermsOfWords);
+        return rootByEightTerms(rootStartWithin(labCubeRootTable, labRow(v), v), labLastTermsOfWords);
     }
     template <class Sums, class F32> static PYXCC_INLINE auto stored(const F32& L, const F32& a, const F32& b)
     {
@@ -63,22 +69,62 @@ struct LabOfWords {
 template <class Depth, class Sums> struct RgbToLab : frame::OnFloats {
     template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
     {
+        const auto [x, y, z] = overWhite(R, G, B);
+        return ofXyz(x, y, z);
+    }
+
+    template <class F32> static PYXCC_INLINE Three<F32> overWhite(const F32& R, const F32& G, const F32& B)
+    {
         const auto [X, Y, Z] = multiplied<Sums>(xyzOfRgb, R, G, B);
-        const F32 x = X * Depth::white.a, y = Y * Depth::white.b, z = Z * Depth::white.c;
-        const F32 rootOfY = root(y);
-        const F32 fx = rootOrLine(x, root(x)), fy = rootOrLine(y, rootOfY), fz = rootOrLine(z, root(z));
-        const F32 L = whereAtMost(y, F32(labLimit), y * 903.3f, Sums::productAndSum(rootOfY, F32(116.0f), F32(-16.0f)));
-        return Depth::template stored<Sums>(L, fx - fy, fy - fz);
+        return {X * Depth::white.a, Y * Depth::white.b, Z * Depth::white.c};
+    }
+
+    template <class F32> static PYXCC_INLINE auto ofXyz(const F32& x, const F32& y, const F32& z)
+    {
+        Three<F32> f = {Depth::root(x), Depth::root(y), Depth::root(z)};
+        F32 L = Sums::productAndSum(f.b, F32(116.0f), F32(-16.0f));
+        // Most blocks have nothing so dark, and are spared the choices.
+        if (anyAtMost(lesser(lesser(x, y), z), F32(labLimit))) {
+            L = whereAtMost(y, F32(labLimit), y * 903.3f, L);
+            f = {rootOrLine(x, f.a), rootOrLine(y, f.b), rootOrLine(z, f.c)};
+        }
+        return Depth::template stored<Sums>(L, f.a - f.b, f.b - f.c);
     }
 
 private:
-    template <class F32> static PYXCC_INLINE F32 root(const F32& v)
-    {
-        return Depth::root(rootStart(labCubeRootTable, trunc(v * labRowsToOne), v));
-    }
     template <class F32> static PYXCC_INLINE F32 rootOrLine(const F32& v, const F32& root)
     {
         return whereAtMost(v, F32(labLimit), fused(v, F32(7.787f), F32(0.13793103f)), root);
+    }
+};
+
+/// Blocks of bytes. Where nothing is dark, smooth roots tell L, a and b to less than a thousandth of a level: enough
+/// for all that is not as near to the middle of two levels, and less work than the table. Blocks that have such a
+/// sample, or a dark one, take the roots that count. To the nearest only: other modes lead elsewhere.
+struct RgbToLabOfBytes : frame::OnFloats {
+    /// As far from a level as no other one can be meant.
+    f32 certainly = scalar::roundsToNearest() ? 0.499f : -1.0f;
+
+    template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
+    {
+        using Exact = RgbToLab<LabOfBytes, FusedSums>;
+        const auto [x, y, z] = Exact::overWhite(R, G, B);
+        if (!anyAtMost(lesser(lesser(x, y), z), F32(smoothRootsFrom))) {
+            constexpr f32 whiteL = 116 * 2.55f, blackL = -16 * 2.55f;
+            const F32 fx = smoothRoot(x), fy = smoothRoot(y), fz = smoothRoot(z);
+            const F32 L = fused(fy, F32(whiteL), F32(blackL));
+            const F32 a = fused(fx - fy, F32(500.0f), F32(128.0f)), b = fused(fy - fz, F32(200.0f), F32(128.0f));
+            const Three lab = {nearest(L), nearest(a), nearest(b)};
+            const F32 furthest = greater(greater(distance(L, lab.a), distance(a, lab.b)), distance(b, lab.c));
+            if (!anyAtMost(F32(certainly), furthest)) return lab;
+        }
+        return Exact::ofXyz(x, y, z);
+    }
+
+private:
+    template <class F32, class S32> static PYXCC_INLINE F32 distance(const F32& x, const S32& level)
+    {
+        return magnitude(x - toF32(level));
     }
 };
 

@@ -32,15 +32,6 @@ auto toRgbOfSignedWords()
     return wideThenTail<4>(OnRaisedWords<LuvToRgbOfWords>{}, OnRaisedWords<LuvToRgbTail<65535>>{});
 }
 
-/// Rows lie as far apart as their step says, to the byte.
-template <class Source, class Target, class Plan, class Sample>
-PyxStatus convert(const Sample* src, Sample* dst, RoiSize roi, const Source& source, const Target& target,
-                  const Plan& plan)
-{
-    if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return eachRow(roi, source, target, plan);
-}
-
 } // namespace
 
 PyxStatus PYXCC_CALL pyxiRGBToLUV_32f_C3R(const f32* src, int srcStep, f32* dst, int dstStep, RoiSize roi)
