@@ -68,7 +68,7 @@ template <class Sample> struct HlsToRgb : frame::OnChannels {
         const auto levels = []<class F32>(const F32& x, const F32& l, const F32& s) PYXCC_INLINE_LAMBDA {
             const F32 inv(HueScale<Sample>::inv), full(HueScale<Sample>::full);
             const F32 Ls = l * inv, Ss = s * inv, P = Ls * Ss;
-            const F32 q = whereAtMost(Ls, F32(0.5f), P, fused(inv, s, -P));
+            const F32 q = lesser(P, fused(inv, s, -P)); // the former if L is up to a half, by more than a last bit
             const F32 m2 = fused(inv, l, q), m1 = fused(Ls, F32(2), -m2), dd = m2 - m1;
             const F32 v = fused(F32(c60), dd * x, m1);
             return Three{nearest(m1 * full), nearest(v * full), nearest(m2 * full)};
@@ -86,7 +86,7 @@ struct HlsToBgr : frame::OnChannels {
         const auto levels = []<class F32>(const F32& x, const F32& l, const F32& s) PYXCC_INLINE_LAMBDA {
             const F32 inv(HueScale<u8>::inv), full(255);
             const F32 Ld = l * inv, Sd = s * inv, a = fused(Sd, inv, -inv);
-            const F32 m2 = whereAtMost(Ld, F32(0.5f), fused(Sd, Ld, Ld), fused(-l, a, Sd));
+            const F32 m2 = lesser(fused(Sd, Ld, Ld), fused(-l, a, Sd)); // likewise
             const F32 m1 = fused(Ld, F32(2), -m2), dd = m2 - m1;
             const F32 v = fused(dd, x * F32(c60), m1);
             return Three{trunc(m1 * full), trunc(v * full), trunc(m2 * full)};
