@@ -1,13 +1,18 @@
 // The forms of Lab and LUV over bytes: vector instances against scalar ones on every input; the table of cube roots
-// against its rule; L by a power against the plain statement.
+// against its rule; on every pixel, against the plain statements, what takes other ways to the same bytes.
 #include "every_input.hpp"
+#include "rounding_modes.hpp"
+
 #include "perceptual/lab_forms.hpp"
 #include "perceptual/luv_by_power.hpp"
 #include "perceptual/luv_inverse_forms.hpp"
+#include "pyxcc/lab.h"
 #include "pyxcc/luv.h"
+#include "reference/lab.hpp"
 #include "reference/luv.hpp"
 
 #include <cmath>
+#include <string>
 #include <vector>
 
 namespace
@@ -20,15 +25,15 @@ template <class Form> class PerceptualFormOfBytes : public testing::Test
 {
 };
 
-using Forms = testing::Types<RgbToLab<LabOfBytes, FusedSums>, RgbToLabCut<LabOfBytes>, LabToRgb<OfLabBytes, FusedSums>,
-                             LabToRgb<OfLabBytes, PlainSums>, RgbToLuvOfBytes, RgbToLuvByPower, LuvToRgbOfBytesC3,
-                             LuvToRgbOfBytesAC4, LuvToRgbTail<255>>;
+using Forms = testing::Types<RgbToLab<LabOfBytes, FusedSums>, RgbToLabOfBytes, RgbToLabCut<LabOfBytes>,
+                             LabToRgb<OfLabBytes, FusedSums>, LabToRgb<OfLabBytes, PlainSums>, RgbToLuvOfBytes,
+                             RgbToLuvByPower, LuvToRgbOfBytesC3, LuvToRgbOfBytesAC4, LuvToRgbTail<255>>;
 
 struct Names {
     template <class Form> static std::string GetName(int i)
     {
-        return std::array{"rgbToLab",        "rgbToLabTail", "labToRgb",    "labToRgbTail", "rgbToLuv",
-                          "rgbToLuvByPower", "luvToRgb",     "luvToRgbAC4", "luvToRgbTail"}[i];
+        return std::array{"rgbToLab", "rgbToLabInBlocks", "rgbToLabTail", "labToRgb",    "labToRgbTail",
+                          "rgbToLuv", "rgbToLuvByPower",  "luvToRgb",     "luvToRgbAC4", "luvToRgbTail"}[i];
     }
 };
 
@@ -63,19 +68,76 @@ TEST(CubeRoot, IsNearTheExactOne)
     }
 }
 
-TEST(LuvByPower, AllPixelsAreThoseOfThePlainStatement)
+// What comes of integer samples is looked up without bounds.
+TEST(CubeRoot, OfWhiteIsWithinTheTable)
 {
-    std::vector<u8> source(4 * 65536), found(4 * 65536), expected(4 * 65536);
-    for (int r = 0; r < 256; ++r) {
-        for (int i = 0; i < 65536; ++i) {
-            source[4 * i] = static_cast<u8>(r);
-            source[4 * i + 1] = static_cast<u8>(i >> 8);
-            source[4 * i + 2] = static_cast<u8>(i);
-        }
-        ASSERT_EQ(pyxiRGBToLUV_8u_AC4R(source.data(), 0, found.data(), 0, {65536, 1}), pyxOk);
-        ASSERT_EQ(reference::pyxiRGBToLUV_8u_AC4R(source.data(), 0, expected.data(), 0, {65536, 1}), pyxOk);
-        ASSERT_EQ(found, expected) << "with a red of " << r;
+    for (const int mode : forms::roundingModes) {
+        forms::roundingBy(mode, [mode] {
+            volatile f32 white = 255, whiteOfWords = 65535; // so that the sums are made in the mode
+            const scalar::F32 v(white), unit(0.003921569f), w(whiteOfWords);
+            const auto [x, y, z] = RgbToLab<LabOfBytes, FusedSums>::overWhite(v, v, v);
+            for (const scalar::F32& of : {x, y, z}) EXPECT_LE(labRow(of).v, 127) << mode;
+            const auto xyz = multiplied<FusedSums>(xyzOfRgb, v * unit, v * unit, v * unit);
+            EXPECT_LE(trunc(xyz.b * 127.998046875f).v, 127) << mode;
+            EXPECT_LE((trunc(multiplied<FusedSums>(xyzOfRgb, w, w, w).b) >> 9).v, 127) << mode;
+        });
     }
 }
+
+TEST(SmoothRoot, IsNearTheExactOne)
+{
+    for (int i = 0; i <= 100000; ++i) {
+        const f32 v = smoothRootsFrom + (1 - smoothRootsFrom) * static_cast<f32>(i) / 100000;
+        EXPECT_NEAR(smoothRoot(scalar::F32(v)).v, std::cbrt(static_cast<f64>(v)), 7e-7) << v;
+    }
+    EXPECT_NEAR(smoothRoot(scalar::F32(1.00001f)).v, 1, 7e-7);
+}
+
+using Interleaved = PyxStatus (*)(const u8*, int, u8*, int, RoiSize);
+
+struct Conversion {
+    const char* name;
+    Interleaved library, plain;
+    int pixelBytes;
+    bool inEveryMode;
+};
+
+class EveryPixelOfPerceptualBytes : public testing::TestWithParam<Conversion>
+{
+};
+
+TEST_P(EveryPixelOfPerceptualBytes, IsThatOfThePlainStatement)
+{
+    const Conversion& conversion = GetParam();
+    constexpr int pixels = 65536;
+    const int bytes = conversion.pixelBytes;
+    std::vector<u8> source(bytes * pixels), found(bytes * pixels), expected(bytes * pixels);
+    for (int first = 0; first < 256; ++first) {
+        for (int i = 0; i < pixels; ++i) {
+            source[bytes * i] = static_cast<u8>(first);
+            source[bytes * i + 1] = static_cast<u8>(i >> 8);
+            source[bytes * i + 2] = static_cast<u8>(i);
+        }
+        for (const int mode : forms::roundingModes) {
+            if (mode != FE_TONEAREST && (!conversion.inEveryMode || first % 51 != 0)) continue;
+            forms::roundingBy(mode, [&] {
+                conversion.library(source.data(), 0, found.data(), 0, {pixels, 1});
+                conversion.plain(source.data(), 0, expected.data(), 0, {pixels, 1});
+            });
+            ASSERT_EQ(found, expected) << "with a first sample of " << first << " in mode " << mode;
+        }
+    }
+}
+
+constexpr Conversion conversions[] = {
+    {"RGBToLab", pyxiRGBToLab_8u_C3R, reference::pyxiRGBToLab_8u_C3R, 3, true},
+    {"BGRToLab", pyxiBGRToLab_8u_C3R, reference::pyxiBGRToLab_8u_C3R, 3, true},
+    {"RGBToLUV", pyxiRGBToLUV_8u_C3R, reference::pyxiRGBToLUV_8u_C3R, 3, true},
+    {"RGBToLUVByPower", pyxiRGBToLUV_8u_AC4R, reference::pyxiRGBToLUV_8u_AC4R, 4, false},
+    {"LUVToRGB", pyxiLUVToRGB_8u_C3R, reference::pyxiLUVToRGB_8u_C3R, 3, true},
+};
+
+INSTANTIATE_TEST_SUITE_P(Conversions, EveryPixelOfPerceptualBytes, testing::ValuesIn(conversions),
+                         [](const auto& info) { return std::string(info.param.name); });
 
 } // namespace
