@@ -135,6 +135,7 @@ constexpr Conversion conversions[] = {
     {"RGBToLUV", pyxiRGBToLUV_8u_C3R, reference::pyxiRGBToLUV_8u_C3R, 3, true},
     {"RGBToLUVByPower", pyxiRGBToLUV_8u_AC4R, reference::pyxiRGBToLUV_8u_AC4R, 4, false},
     {"LUVToRGB", pyxiLUVToRGB_8u_C3R, reference::pyxiLUVToRGB_8u_C3R, 3, true},
+    {"LUVToRGBOfFour", pyxiLUVToRGB_8u_AC4R, reference::pyxiLUVToRGB_8u_AC4R, 4, true},
 };
 
 INSTANTIATE_TEST_SUITE_P(Conversions, EveryPixelOfPerceptualBytes, testing::ValuesIn(conversions),
