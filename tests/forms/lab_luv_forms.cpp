@@ -79,6 +79,8 @@ TEST(CubeRoot, OfWhiteIsWithinTheTable)
             for (const scalar::F32& of : {x, y, z}) EXPECT_LE(labRow(of).v, 127) << mode;
             const auto xyz = multiplied<FusedSums>(xyzOfRgb, v * unit, v * unit, v * unit);
             EXPECT_LE(trunc(xyz.b * 127.998046875f).v, 127) << mode;
+            EXPECT_LE(trunc((FusedSums::weighted(yOfRgb, v, v, v) / scalar::F32(255.0f)) * 127.998046875f).v, 127)
+                << mode;
             EXPECT_LE((trunc(multiplied<FusedSums>(xyzOfRgb, w, w, w).b) >> 9).v, 127) << mode;
         });
     }
