@@ -5,7 +5,8 @@
 // so that no column is left over for the compiler to make code of that takes one at a time.
 #pragma once
 
-#include "pyxcc/types.h"
+#include "lanes/lanes.hpp"
+#include "layouts/rows.hpp"
 
 #include <algorithm>
 #include <array>
@@ -115,32 +116,64 @@ void interpolateColors(const ThreeRows<T>& mosaic, const ThreeRows<T>& greens, T
     }
 }
 
-/// Luma and chroma of a stretch of a row, and one column more, which may be looked at but does not count.
-template <class T, int Columns> struct LumaChroma {
-    using Number = NumberFor<T>;
-    alignas(32) Number y[Columns + 1], cb[Columns + 1], cr[Columns + 1];
+/// Luma and chroma of a stretch of a row, and of some columns more, which may be looked at but do not count.
+template <int Columns> struct LumaChroma {
+    static constexpr int spare = 16;
+    alignas(32) s16 y[Columns + spare], cb[Columns + spare], cr[Columns + spare];
 };
 
 /// (66 R + 129 G + 25 B + 128) >> 8 and so on, by what red and blue have more than green: that takes fewer products.
 /// The weights of chroma add up to nothing. 16 bits hold the sums for bytes: that for luma without a sign, those for
 /// chroma with one.
-template <class T, int Columns, class Count>
-void toLumaChroma(const T* red, const T* green, const T* blue, LumaChroma<T, Columns>& to, Count count)
+template <int Columns, class Count>
+void toLumaChroma(const u8* red, const u8* green, const u8* blue, LumaChroma<Columns>& to, Count count)
 {
-    using Number = typename LumaChroma<T, Columns>::Number;
-    using Luma = std::make_unsigned_t<Number>;
-    Number* __restrict const toY = to.y;
-    Number* __restrict const toCb = to.cb;
-    Number* __restrict const toCr = to.cr;
+    s16* __restrict const toY = to.y;
+    s16* __restrict const toCb = to.cb;
+    s16* __restrict const toCr = to.cr;
     for (int x = 0; x < count; ++x) {
-        const Number g = green[x];
-        const auto r = static_cast<Number>(red[x] - g), b = static_cast<Number>(blue[x] - g);
-        toY[x] = static_cast<Number>(static_cast<Luma>(220 * g + 66 * r + 25 * b + 128) >> 8);
-        toCb[x] = static_cast<Number>(static_cast<Number>(112 * b - 38 * r + 128) >> 8);
-        toCr[x] = static_cast<Number>(static_cast<Number>(112 * r - 18 * b + 128) >> 8);
+        const s16 g = green[x];
+        const auto r = static_cast<s16>(red[x] - g), b = static_cast<s16>(blue[x] - g);
+        toY[x] = static_cast<s16>(static_cast<u16>(220 * g + 66 * r + 25 * b + 128) >> 8);
+        toCb[x] = static_cast<s16>(static_cast<s16>(112 * b - 38 * r + 128) >> 8);
+        toCr[x] = static_cast<s16>(static_cast<s16>(112 * r - 18 * b + 128) >> 8);
     }
     toY[count] = toCb[count] = toCr[count] = 0;
 }
+
+/// What samples of 16 bits are above 32768 fits multiply-adds. It is nothing to chroma, and takes 28160 from luma,
+/// which leaves distances as they are.
+template <class Word> PYXCC_INLINE auto lumaAndChroma(Word r, Word g, Word b)
+{
+    const auto R = lowered(r), G = lowered(g), B = lowered(b);
+    return Three{exactSum<8, 128, 66, 129, 25>(R, G, B), exactSum<8, 128, -38, -74, 112>(R, G, B),
+                 exactSum<8, 128, 112, -94, -18>(R, G, B)};
+}
+
+template <int Columns, class Count>
+void toLumaChroma(const u16* red, const u16* green, const u16* blue, LumaChroma<Columns>& to, Count count)
+{
+    using layouts::bytes, layouts::loadSamples, layouts::storeSamples;
+    constexpr int block = wide::U16::count;
+    const auto convert = [&to](int x, const u16* r, const u16* g, const u16* b) PYXCC_INLINE_LAMBDA {
+        const auto sample = [](const u16* from) PYXCC_INLINE_LAMBDA { return loadSamples<wide::U16>(bytes(from)); };
+        const auto converted = lumaAndChroma(sample(r), sample(g), sample(b));
+        storeSamples(bytes(to.y + x), converted.a);
+        storeSamples(bytes(to.cb + x), converted.b);
+        storeSamples(bytes(to.cr + x), converted.c);
+    };
+    int x = 0;
+    for (; x <= count - block; x += block) convert(x, red + x, green + x, blue + x);
+    // One column more than there are.
+    u16 rest[3][block] = {};
+    std::copy_n(red + x, count - x, rest[0]);
+    std::copy_n(green + x, count - x, rest[1]);
+    std::copy_n(blue + x, count - x, rest[2]);
+    convert(x, rest[0], rest[1], rest[2]);
+}
+
+/// Distances of luma are as wide as those of chroma, so that they are compared alike.
+template <class T> using DistanceFor = std::conditional_t<sizeof(T) == 1, s16, s32>;
 
 /// A sum of two squares of chroma. Those of bytes are below 65536: the largest is that of green and magenta. Those of
 /// 16-bit samples may leave 32 bits, and wrap.
@@ -148,24 +181,24 @@ template <class T> using SquaresFor = std::conditional_t<sizeof(T) == 1, u16, s3
 
 /// How far samples are from their neighbours; one more than count here, too.
 template <class T, int Columns> struct Distances {
-    alignas(32) NumberFor<T> luma[Columns + 1];
+    alignas(32) DistanceFor<T> luma[Columns + 1];
     alignas(32) SquaresFor<T> chroma[Columns + 1];
 };
 
 /// Between the samples of one row and those of another, from its column `from` on.
 template <int from, class T, int Columns, class Count>
-void measure(const LumaChroma<T, Columns>& a, const LumaChroma<T, Columns>& b, Distances<T, Columns>& to, Count count)
+void measure(const LumaChroma<Columns>& a, const LumaChroma<Columns>& b, Distances<T, Columns>& to, Count count)
 {
-    using Number = NumberFor<T>;
-    const Number *const ay = a.y, *const acb = a.cb, *const acr = a.cr;
-    const Number *const by = b.y + from, *const bcb = b.cb + from, *const bcr = b.cr + from;
-    NumberFor<T>* __restrict const luma = to.luma;
+    using Distance = DistanceFor<T>;
+    const s16 *const ay = a.y, *const acb = a.cb, *const acr = a.cr;
+    const s16 *const by = b.y + from, *const bcb = b.cb + from, *const bcr = b.cr + from;
+    Distance* __restrict const luma = to.luma;
     SquaresFor<T>* __restrict const chroma = to.chroma;
     for (int x = 0; x < count; ++x) {
-        const auto y = static_cast<Number>(ay[x] - by[x]);
-        luma[x] = static_cast<Number>(y < 0 ? -y : y);
-        const auto cb = static_cast<u32>(static_cast<Number>(acb[x] - bcb[x]));
-        const auto cr = static_cast<u32>(static_cast<Number>(acr[x] - bcr[x]));
+        const auto y = static_cast<Distance>(ay[x] - by[x]);
+        luma[x] = static_cast<Distance>(y < 0 ? -y : y);
+        const auto cb = static_cast<u32>(static_cast<Distance>(acb[x] - bcb[x]));
+        const auto cr = static_cast<u32>(static_cast<Distance>(acr[x] - bcr[x]));
         chroma[x] = static_cast<SquaresFor<T>>(cb * cb + cr * cr);
     }
     luma[count] = 0;
@@ -186,7 +219,7 @@ template <class T, int Columns, class Count>
 void scoreCandidates(const DistancesAround<T, Columns>& h, const DistancesAround<T, Columns>& v, u8* __restrict scores,
                      Count count)
 {
-    using Luma = NumberFor<T>;
+    using Luma = DistanceFor<T>;
     using Chroma = SquaresFor<T>;
     const Luma *const hBeside = h.beside->luma, *const hAbove = h.above->luma + 1, *const hBelow = h.below->luma + 1;
     const Luma *const vBeside = v.beside->luma, *const vAbove = v.above->luma + 1, *const vBelow = v.below->luma + 1;
@@ -199,7 +232,7 @@ void scoreCandidates(const DistancesAround<T, Columns>& h, const DistancesAround
         const Chroma limitC = std::min(std::max(hBesideC[x], hBesideC[x + 1]), std::max(vAboveC[x], vBelowC[x]));
         // -1 for what is too far: comparisons are masks.
         const auto isBeyond = [&](Luma luma, Chroma chroma) {
-            const Luma far = luma > limit ? Luma{-1} : Luma{0}, farC = chroma > limitC ? Luma{-1} : Luma{0};
+            const Luma far = luma > limit ? -1 : 0, farC = chroma > limitC ? -1 : 0;
             return static_cast<Luma>(far | farC);
         };
         const auto alongRow =

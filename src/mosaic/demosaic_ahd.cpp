@@ -173,7 +173,7 @@ private:
     static void measureCandidate(const typename Planes<T>::Candidate& candidate, s32 y, int rows, int column,
                                  Measured& to, Count count)
     {
-        LumaChroma<T, stretch> converted[4];
+        LumaChroma<stretch> converted[4];
         for (int i = 0; i < rows + 2; ++i) {
             const auto from = [y = y + i - 1, column](const auto& ring) { return ring.row(y) + column; };
             toLumaChroma(from(candidate.red), from(candidate.green), from(candidate.blue), converted[i], count);
