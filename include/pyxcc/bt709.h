@@ -24,6 +24,8 @@
  * RoiSize size = {1920, 1080};
  * PyxStatus status = pyxiBGRToYCbCr420_709CSC_8u_AC4P3R(bgra, 1920 * 4, planes, steps, size);
  * @endcode
+ *
+ * @see @ref family-bt709
  */
 #ifndef PYXCC_BT709_H
 #define PYXCC_BT709_H

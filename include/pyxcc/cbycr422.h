@@ -38,6 +38,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiRGBToCbYCr422_8u_C3C2R(rgb, 640 * 3, packed, 640 * 2, size);
  * @endcode
+ *
+ * @see @ref family-cbycr422
  */
 #ifndef PYXCC_CBYCR422_H
 #define PYXCC_CBYCR422_H

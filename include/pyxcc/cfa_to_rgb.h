@@ -36,6 +36,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiCFAToRGB_8u_C1C3R(mosaic, whole, size, 640, rgb, 640 * 3, 0, 0);
  * @endcode
+ *
+ * @see @ref family-cfa
  */
 #ifndef PYXCC_CFA_TO_RGB_H
 #define PYXCC_CFA_TO_RGB_H
@@ -62,7 +64,19 @@ extern "C" {
 PYXCC_API PyxStatus PYXCC_CALL pyxiCFAToRGB_16u_C1C3R(const u16* src, RoiRect srcRoi, RoiSize srcSize, int srcStep,
                                                       u16* dst, int dstStep, s32 grid, s32 interpolation);
 
-/** 8-bit samples; otherwise as pyxiCFAToRGB_16u_C1C3R(). */
+/**
+ * 8-bit samples; otherwise as pyxiCFAToRGB_16u_C1C3R().
+ *
+ * @param src the first sample of the mosaic
+ * @param srcRoi the region to convert, within the mosaic
+ * @param srcSize width and height of the mosaic, each at least 2
+ * @param srcStep bytes from one source row to the next
+ * @param dst the first pixel of the converted region: R, G and B
+ * @param dstStep bytes from one target row to the next
+ * @param grid 0 to 3, the colours of the mosaic
+ * @param interpolation not used; any value will do
+ * @return ::pyxOk, ::pyxErrNullPtr, ::pyxErrSize or ::pyxErrBadArg
+ */
 PYXCC_API PyxStatus PYXCC_CALL pyxiCFAToRGB_8u_C1C3R(const u8* src, RoiRect srcRoi, RoiSize srcSize, int srcStep,
                                                      u8* dst, int dstStep, s32 grid, s32 interpolation);
 

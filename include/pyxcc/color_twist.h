@@ -35,6 +35,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiColorTwist32f_8u_C3IR(rgb, 640 * 3, size, sepia);
  * @endcode
+ *
+ * @see @ref family-color-twist
  */
 #ifndef PYXCC_COLOR_TWIST_H
 #define PYXCC_COLOR_TWIST_H

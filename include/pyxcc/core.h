@@ -15,29 +15,44 @@ extern "C" {
 
 /** Bits of the mask that pyxGetEnabledCpuFeatures() returns. */
 enum {
-    pyxCpuSse2 = 1 << 0,
-    pyxCpuSse3 = 1 << 1,
-    pyxCpuSsse3 = 1 << 2,
-    pyxCpuSse41 = 1 << 3,
-    pyxCpuSse42 = 1 << 4,
-    pyxCpuAvx = 1 << 5,
-    pyxCpuFma = 1 << 6,
-    pyxCpuAvx2 = 1 << 7
+    pyxCpuSse2 = 1 << 0,  /**< SSE2 */
+    pyxCpuSse3 = 1 << 1,  /**< SSE3 */
+    pyxCpuSsse3 = 1 << 2, /**< SSSE3 */
+    pyxCpuSse41 = 1 << 3, /**< SSE4.1 */
+    pyxCpuSse42 = 1 << 4, /**< SSE4.2 */
+    pyxCpuAvx = 1 << 5,   /**< AVX */
+    pyxCpuFma = 1 << 6,   /**< FMA */
+    pyxCpuAvx2 = 1 << 7   /**< AVX2 */
 };
 
 /**
- * Allocates `byteCount` bytes aligned to 64 bytes. Returns null for a count below 1 and when memory is exhausted.
- * Safe to call from several threads at once.
+ * Allocates memory. Safe to call from several threads at once.
+ *
+ * @param byteCount size in bytes
+ * @return memory aligned to 64 bytes, or null for a count below 1 and when memory is exhausted
  */
 PYXCC_API void* PYXCC_CALL pyxMalloc(s32 byteCount);
 
-/** Frees what pyxMalloc() returned; null is allowed. */
+/**
+ * Frees memory. Safe to call from several threads at once.
+ *
+ * @param memory what pyxMalloc() returned, or null
+ */
 PYXCC_API void PYXCC_CALL pyxFree(void* memory);
 
-/** Stores the size in bytes of the processor's largest cache in `*size`. Returns ::pyxOk, or an error if not known. */
+/**
+ * Finds the size of the processor's largest cache.
+ *
+ * @param size takes the size in bytes
+ * @return ::pyxOk, or an error if it is not known
+ */
 PYXCC_API PyxStatus PYXCC_CALL pyxGetMaxCacheSizeB(s32* size);
 
-/** Returns the mask of the processor features that programs may use. */
+/**
+ * Finds what the processor and the operating system offer.
+ *
+ * @return the mask of the features that programs may use, of bits like ::pyxCpuAvx2
+ */
 PYXCC_API u32 PYXCC_CALL pyxGetEnabledCpuFeatures(void);
 
 #ifdef __cplusplus

@@ -52,6 +52,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiDemosaicAHD_8u_C1C3R(mosaic, whole, size, 640, rgb, 640 * 3, 0, workspace, 646);
  * @endcode
+ *
+ * @see @ref family-demosaic-ahd
  */
 #ifndef PYXCC_DEMOSAIC_AHD_H
 #define PYXCC_DEMOSAIC_AHD_H
@@ -79,7 +81,20 @@ extern "C" {
 PYXCC_API PyxStatus PYXCC_CALL pyxiDemosaicAHD_16u_C1C3R(const u16* src, RoiRect srcRoi, RoiSize srcSize, int srcStep,
                                                          u16* dst, int dstStep, s32 grid, u16* tmp, int tmpStep);
 
-/** 8-bit samples; otherwise as pyxiDemosaicAHD_16u_C1C3R(). */
+/**
+ * 8-bit samples; otherwise as pyxiDemosaicAHD_16u_C1C3R().
+ *
+ * @param src the first sample of the mosaic
+ * @param srcRoi the region to convert
+ * @param srcSize width and height of the mosaic, each at least 5
+ * @param srcStep bytes from one source row to the next
+ * @param dst the first pixel of the converted region: R, G and B
+ * @param dstStep bytes from one target row to the next
+ * @param grid 0 to 3, the colours of the mosaic
+ * @param tmp memory to work in
+ * @param tmpStep bytes from one of its 30 rows to the next
+ * @return ::pyxOk, ::pyxErrNullPtr, ::pyxErrSize or ::pyxErrBadArg
+ */
 PYXCC_API PyxStatus PYXCC_CALL pyxiDemosaicAHD_8u_C1C3R(const u8* src, RoiRect srcRoi, RoiSize srcSize, int srcStep,
                                                         u8* dst, int dstStep, s32 grid, u8* tmp, int tmpStep);
 

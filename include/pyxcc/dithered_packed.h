@@ -32,6 +32,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiYCbCr420ToBGR565Dither_8u16u_P3C3R(planes, steps, pixels, 640 * 2, size);
  * @endcode
+ *
+ * @see @ref family-dithered-packed
  */
 #ifndef PYXCC_DITHERED_PACKED_H
 #define PYXCC_DITHERED_PACKED_H

@@ -60,6 +60,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiYCbCr420ToYCbCr422_Filter_8u_P3R(from, steps, to, steps, size);
  * @endcode
+ *
+ * @see @ref family-filter-interlace
  */
 #ifndef PYXCC_FILTER_INTERLACE_H
 #define PYXCC_FILTER_INTERLACE_H

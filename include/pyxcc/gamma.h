@@ -36,6 +36,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiGammaFwd_32f_C3IR(rgb, 640 * 3 * sizeof(f32), size, 0.0f, 1.0f);
  * @endcode
+ *
+ * @see @ref family-gamma
  */
 #ifndef PYXCC_GAMMA_H
 #define PYXCC_GAMMA_H

@@ -37,6 +37,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiRGBToGray_8u_C3C1R(rgb, 640 * 3, gray, 640, size);
  * @endcode
+ *
+ * @see @ref family-gray
  */
 #ifndef PYXCC_GRAY_H
 #define PYXCC_GRAY_H

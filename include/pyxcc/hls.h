@@ -46,6 +46,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiRGBToHLS_8u_C3R(rgb, 640 * 3, hls, 640 * 3, size);
  * @endcode
+ *
+ * @see @ref family-hls
  */
 #ifndef PYXCC_HLS_H
 #define PYXCC_HLS_H

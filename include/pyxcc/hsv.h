@@ -37,6 +37,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiRGBToHSV_8u_C3R(rgb, 640 * 3, hsv, 640 * 3, size);
  * @endcode
+ *
+ * @see @ref family-hsv
  */
 #ifndef PYXCC_HSV_H
 #define PYXCC_HSV_H

@@ -30,6 +30,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiRGBToLab_8u_C3R(rgb, 640 * 3, lab, 640 * 3, size);
  * @endcode
+ *
+ * @see @ref family-lab
  */
 #ifndef PYXCC_LAB_H
 #define PYXCC_LAB_H

@@ -33,6 +33,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiRGBToLUV_8u_C3R(rgb, 640 * 3, luv, 640 * 3, size);
  * @endcode
+ *
+ * @see @ref family-luv
  */
 #ifndef PYXCC_LUV_H
 #define PYXCC_LUV_H

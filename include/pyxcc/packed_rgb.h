@@ -44,6 +44,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiBGR565ToYCbCr420_16u8u_C3P3R(pixels, 640 * 2, planes, steps, size);
  * @endcode
+ *
+ * @see @ref family-packed-rgb
  */
 #ifndef PYXCC_PACKED_RGB_H
 #define PYXCC_PACKED_RGB_H

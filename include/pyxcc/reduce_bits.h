@@ -56,6 +56,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiReduceBits_8u_C1R(gray, 640, halftone, 640, size, 0, 1, 2);
  * @endcode
+ *
+ * @see @ref family-reduce-bits
  */
 #ifndef PYXCC_REDUCE_BITS_H
 #define PYXCC_REDUCE_BITS_H

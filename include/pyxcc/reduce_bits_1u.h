@@ -1,6 +1,8 @@
 /**
  * @file
  * @brief Bytes to one bit a pixel, by a threshold or by error diffusion.
+ *
+ * @see @ref family-reduce-bits-1u
  */
 #ifndef PYXCC_REDUCE_BITS_1U_H
 #define PYXCC_REDUCE_BITS_1U_H

@@ -34,6 +34,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiYCbCr420ToYCbCr422_8u_P2C2R(y, 640, cbCr, 640, packed, 640 * 2, size);
  * @endcode
+ *
+ * @see @ref family-repack
  */
 #ifndef PYXCC_REPACK_H
 #define PYXCC_REPACK_H

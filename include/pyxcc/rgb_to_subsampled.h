@@ -31,6 +31,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiRGBToYCbCr420_8u_C3P3R(rgb, 640 * 3, planes, steps, size);
  * @endcode
+ *
+ * @see @ref family-rgb-to-subsampled
  */
 #ifndef PYXCC_RGB_TO_SUBSAMPLED_H
 #define PYXCC_RGB_TO_SUBSAMPLED_H

@@ -21,6 +21,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiRGBToYCbCr_8u_C3R(rgb, 640 * 3, ycbcr, 640 * 3, size);
  * @endcode
+ *
+ * @see @ref family-rgb-ycbcr
  */
 #ifndef PYXCC_RGB_YCBCR_H
 #define PYXCC_RGB_YCBCR_H

@@ -21,6 +21,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiRGBToYUV_8u_C3R(rgb, 640 * 3, yuv, 640 * 3, size);
  * @endcode
+ *
+ * @see @ref family-rgb-yuv
  */
 #ifndef PYXCC_RGB_YUV_H
 #define PYXCC_RGB_YUV_H

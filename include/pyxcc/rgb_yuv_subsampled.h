@@ -31,6 +31,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiRGBToYUV420_8u_C3P3(rgb, planes, size);
  * @endcode
+ *
+ * @see @ref family-rgb-yuv-subsampled
  */
 #ifndef PYXCC_RGB_YUV_SUBSAMPLED_H
 #define PYXCC_RGB_YUV_SUBSAMPLED_H

@@ -34,6 +34,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiYCbCr420ToRGB_8u_P3C3R(planes, steps, rgb, 640 * 3, size);
  * @endcode
+ *
+ * @see @ref family-subsampled-to-rgb
  */
 #ifndef PYXCC_SUBSAMPLED_TO_RGB_H
 #define PYXCC_SUBSAMPLED_TO_RGB_H

@@ -20,6 +20,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiToneMapMean_32f8u_C1R(radiance, 640 * sizeof(f32), gray, 640, size);
  * @endcode
+ *
+ * @see @ref family-tone-map
  */
 #ifndef PYXCC_TONE_MAP_H
 #define PYXCC_TONE_MAP_H

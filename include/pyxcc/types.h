@@ -47,6 +47,7 @@ typedef double f64;   /**< IEEE 754 binary64 sample */
  */
 typedef s32 PyxStatus;
 
+/** The values of ::PyxStatus. */
 enum {
     pyxOk = 0,                /**< done */
     pyxWarnNegativeLevel = 1, /**< the level found in the source is negative; nothing was written */
@@ -65,16 +66,16 @@ enum {
 
 /** Size of a region of interest in pixels, passed by value. */
 typedef struct RoiSize {
-    s32 width;
-    s32 height;
+    s32 width;  /**< columns */
+    s32 height; /**< rows */
 } RoiSize;
 
 /** Place and size of a region within an image in pixels, passed by value. */
 typedef struct RoiRect {
-    s32 x;
-    s32 y;
-    s32 width;
-    s32 height;
+    s32 x;      /**< the first column, from 0 */
+    s32 y;      /**< the first row, from 0 */
+    s32 width;  /**< columns */
+    s32 height; /**< rows */
 } RoiRect;
 
 #ifdef __cplusplus

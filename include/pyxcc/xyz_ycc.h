@@ -48,6 +48,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiRGBToXYZ_8u_C3R(rgb, 640 * 3, xyz, 640 * 3, size);
  * @endcode
+ *
+ * @see @ref family-xyz-ycc
  */
 #ifndef PYXCC_XYZ_YCC_H
 #define PYXCC_XYZ_YCC_H

@@ -37,6 +37,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiYCbCr420ToBGR565_8u16u_P3C3R(planes, steps, pixels, 640 * 2, size);
  * @endcode
+ *
+ * @see @ref family-ycbcr-to-packed
  */
 #ifndef PYXCC_YCBCR_TO_PACKED_H
 #define PYXCC_YCBCR_TO_PACKED_H

@@ -30,6 +30,8 @@
  * RoiSize size = {640, 480};
  * PyxStatus status = pyxiBGRToYCoCg_Rev_8u16s_C3P3R(bgr, 640 * 3, planes, 640 * sizeof(s16), size);
  * @endcode
+ *
+ * @see @ref family-ycocg
  */
 #ifndef PYXCC_YCOCG_H
 #define PYXCC_YCOCG_H
