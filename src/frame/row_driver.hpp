@@ -38,6 +38,35 @@ template <class Form> constexpr auto everyPixel(Form form)
     return spans([](int width) { return std::array{width}; }, form);
 }
 
+/// A form that says so is a long chain of operations. Each of its blocks is stored while the next one is computed:
+/// what waits for a result keeps the processor from taking up what could go on meanwhile.
+template <class Form>
+concept StoredLate = requires
+{
+    requires Form::storedLate;
+};
+
+/// Takes whole blocks through such a form, from `x` on, and returns where they end.
+template <class Source, class Target, class Form>
+PYXCC_INLINE int convertBlocksStoredLate(const Source& source, const Target& target, int x, int to, const Form& form)
+{
+    constexpr int block = Source::block;
+    auto result = apply(form, source.load(x));
+    if (x <= to - 2 * block) {
+        auto pixels = source.load(x + block);
+        for (; x <= to - 3 * block; x += block) {
+            target.store(x, result);
+            result = apply(form, pixels);
+            pixels = source.load(x + 2 * block);
+        }
+        target.store(x, result);
+        result = apply(form, pixels);
+        x += block;
+    }
+    target.store(x, result);
+    return x + block;
+}
+
 /// Takes the columns [from, to) of a row through a form: whole blocks, then what is left as one partial block, which
 /// reads and writes nothing beyond it.
 template <class Source, class Target, class Form>
@@ -46,7 +75,11 @@ PYXCC_INLINE void convertColumns(const Source& source, const Target& target, int
     constexpr int block = Source::block;
     static_assert(block == Target::block);
     int x = from;
-    if (x <= to - block) {
+    if (x > to - block) {
+        // None is whole.
+    } else if constexpr (StoredLate<Form>) {
+        x = convertBlocksStoredLate(source, target, x, to, form);
+    } else {
         // Each block is loaded before the one in front of it is stored: taking interleaved pixels apart is a long chain
         // of shuffles, which so runs beside the form's instead of in front of it.
         auto pixels = source.load(x);

@@ -134,6 +134,7 @@ inline F32 whereLess(F32 x, F32 y, F32 yes, F32 no) { return x.v < y.v ? yes : n
 inline F32 whereAtMost(F32 x, F32 y, F32 yes, F32 no) { return x.v <= y.v ? yes : no; }
 inline F32 whereEqual(F32 x, F32 y, F32 yes, F32 no) { return x.v == y.v ? yes : no; }
 inline F32 zeroWhereLess(F32 x, F32 y, F32 z) { return x.v < y.v ? F32(0.0f) : z; }
+inline S32 oneMoreWhereLess(F32 x, F32 y, S32 n) { return x.v < y.v ? n.v + 1 : n.v; }
 inline F32 whereSigned(F32 x, F32 yes, F32 no) { return std::signbit(x.v) ? yes : no; }
 inline bool anyAtMost(F32 x, F32 y) { return x.v <= y.v; }
 inline F32 magnitude(F32 x) { return std::fabs(x.v); }

@@ -5,6 +5,7 @@
 #include "pyxcc/types.h"
 
 #include <cstddef>
+#include <cstring>
 
 namespace pyxcc::layouts
 {
@@ -15,6 +16,14 @@ template <class Byte> PYXCC_INLINE Byte* rowAt(Byte* first, std::ptrdiff_t step,
 /// Images are walked in bytes, since a row need not be aligned to its samples.
 template <class T> PYXCC_INLINE const u8* bytes(const T* samples) { return reinterpret_cast<const u8*>(samples); }
 template <class T> PYXCC_INLINE u8* bytes(T* samples) { return reinterpret_cast<u8*>(samples); }
+
+/// Sample `x` of a row, which need not be aligned to its samples.
+template <class Sample> PYXCC_INLINE Sample sampleAt(const u8* row, std::ptrdiff_t x)
+{
+    Sample sample;
+    std::memcpy(&sample, row + x * std::ptrdiff_t{sizeof sample}, sizeof sample);
+    return sample;
+}
 
 /// Hints at cache lines some distance behind `p`. Interleaved rows go through memory fast, and those that share a loop
 /// with other rows outrun the processor's own look-ahead. A hint neither reads nor faults, so that it may reach behind

@@ -4,6 +4,7 @@
 
 #include "layouts/avx2/eights.hpp"
 #include "layouts/avx2/eights_of_words.hpp"
+#include "layouts/avx2/sixteens.hpp"
 #include "layouts/images.hpp"
 
 namespace pyxcc::layouts
@@ -18,6 +19,17 @@ template <class Byte> struct C3Eights {
     static PYXCC_INLINE Three<wide::F32> load(const u8* p) { return loadEightTriples<Byte>(p); }
     static PYXCC_INLINE void store(u8* p, const Three<wide::S32>& pixels) { storeEightTriples<Byte>(p, pixels); }
 };
+
+/// The same, sixteen pixels a block: factors in, integers out.
+template <class Byte> struct C3Sixteens {
+    using Samples = Factor<Byte>;
+    static constexpr int pixelBytes = 3;
+    static constexpr bool readsTarget = false;
+
+    static PYXCC_INLINE auto load(const u8* p) { return loadSixteenTriples<Byte>(p); }
+    static PYXCC_INLINE void store(u8* p, const Two<Three<wide::S32>>& pixels) { storeSixteenTriples<Byte>(p, pixels); }
+};
+template <class Byte> inline constexpr int blockOf<C3Sixteens<Byte>> = 16;
 
 /// Three interleaved unsigned words a pixel, eight pixels a block too.
 template <> struct C3Eights<u16> {
@@ -47,6 +59,11 @@ template <class Byte> struct AC4Eights {
 template <class Sample> auto c3Eights(Sample* first, std::ptrdiff_t step)
 {
     return detail::interleaved(first, step, C3Eights<std::remove_const_t<Sample>>{});
+}
+
+template <class Byte> auto c3ForFactors(Byte* first, std::ptrdiff_t step)
+{
+    return detail::interleaved(first, step, C3Sixteens<std::remove_const_t<Byte>>{});
 }
 
 template <class Sample> auto c3ForFloats(Sample* first, std::ptrdiff_t step)

@@ -4,6 +4,7 @@
 #include "layouts/avx2/chroma.hpp"
 #include "layouts/avx2/eights.hpp"
 #include "layouts/avx2/gray.hpp"
+#include "layouts/avx2/stream.hpp"
 #include "layouts/images.hpp"
 
 namespace pyxcc::layouts
@@ -17,6 +18,7 @@ template <class Register, Order order = Order::ofMemory> struct C1 {
 
     static PYXCC_INLINE Samples load(const u8* p) { return loadSamples<Samples>(p); }
     static PYXCC_INLINE void store(u8* p, Samples samples) { storeSamples(p, inMemoryOrder<order>(samples)); }
+    static PYXCC_INLINE void stream(u8* p, Samples samples) { streamSamples(p, inMemoryOrder<order>(samples)); }
 };
 
 /// Three samples a pixel, all of them the same.

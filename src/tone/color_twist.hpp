@@ -10,23 +10,25 @@
 namespace pyxcc::tone
 {
 
+/// Integer samples through a form, whatever the caller's rounding mode.
+template <class Source, class Target, class Form>
+PyxStatus twistRowsByNearest(RoiSize roi, const Source& source, const Target& target, const Form& form)
+{
+    frame::roundingToNearest([&] { frame::eachRow(roi, source, target, frame::everyPixel(form)); });
+    return pyxOk;
+}
+
 /// Integer samples do not depend on the caller's rounding mode, floats follow it.
 template <class Sample, class Source, class Target>
 PyxStatus twistRows(RoiSize roi, const Source& source, const Target& target, const f32 twist[3][4])
 {
-    using namespace frame;
-    if constexpr (std::is_integral_v<Sample>) {
-        roundingToNearest([&] {
-            if (TwistWithinIntegers<Sample>::suits(twist)) {
-                eachRow(roi, source, target, everyPixel(TwistWithinIntegers<Sample>(twist)));
-            } else {
-                eachRow(roi, source, target, everyPixel(TwistToInteger<Sample>(twist)));
-            }
-        });
+    if constexpr (!std::is_integral_v<Sample>) {
+        return frame::eachRow(roi, source, target, frame::everyPixel(TwistOf<Sample>(twist)));
+    } else if (TwistWithinIntegers<Sample>::suits(twist)) {
+        return twistRowsByNearest(roi, source, target, TwistWithinIntegers<Sample>(twist));
     } else {
-        eachRow(roi, source, target, everyPixel(TwistOf<Sample>(twist)));
+        return twistRowsByNearest(roi, source, target, TwistToInteger<Sample>(twist));
     }
-    return pyxOk;
 }
 
 template <class Sample>
@@ -41,6 +43,11 @@ template <class Sample>
 PyxStatus twistC3(const Sample* src, int srcStep, Sample* dst, int dstStep, RoiSize roi, const f32 twist[3][4])
 {
     if (const PyxStatus failure = twistFailure(src, srcStep, dst, dstStep, roi, twist)) return failure;
+    if constexpr (sizeof(Sample) == 1) {
+        if (TwistOfBytes<Sample>::suits(twist))
+            return twistRowsByNearest(roi, layouts::c3ForFactors(src, srcStep), layouts::c3ForFactors(dst, dstStep),
+                                      TwistOfBytes<Sample>(twist));
+    }
     return twistRows<Sample>(roi, layouts::c3ForFloats(src, srcStep), layouts::c3ForFloats(dst, dstStep), twist);
 }
 
@@ -60,6 +67,11 @@ PyxStatus twistP3(const Sample* const src[3], int srcStep, Sample* const dst[3],
             firstFailure(notNull(src, dst, twist), elementsNotNull<3>(src), elementsNotNull<3>(dst),
                          sizeAtLeast(roi, 1, 1), stepsAtLeast1(srcStep, dstStep)))
         return failure;
+    if constexpr (sizeof(Sample) == 1) {
+        if (TwistOfBytes<Sample>::suits(twist))
+            return twistRowsByNearest(roi, layouts::p3(src, srcStep), layouts::p3(dst, dstStep),
+                                      TwistOfPlanes<Sample>(twist));
+    }
     return twistRows<Sample>(roi, layouts::p3(src, srcStep), layouts::p3(dst, dstStep), twist);
 }
 

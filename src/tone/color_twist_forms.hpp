@@ -2,6 +2,7 @@
 #pragma once
 
 #include "frame/float_forms.hpp"
+#include "lanes/avx2/byte_factors.hpp"
 
 #include <algorithm>
 #include <cmath>
@@ -28,11 +29,16 @@ struct TwistByPairs : frame::OnFloats {
     template <class F32> PYXCC_INLINE auto operator()(const F32& s0, const F32& s1, const F32& s2) const
     {
         const auto channel = [&](const f32* k) PYXCC_INLINE_LAMBDA {
-            const F32 a = F32(k[3]) + s0 * F32(k[0]);
-            const F32 b = s2 * F32(k[2]) + s1 * F32(k[1]);
-            return a + b;
+            return sum(s0 * F32(k[0]), s1 * F32(k[1]), s2 * F32(k[2]), F32(k[3]));
         };
         return Three{channel(twist.k[0]), channel(twist.k[1]), channel(twist.k[2])};
+    }
+
+    template <class F32> static PYXCC_INLINE F32 sum(const F32& p0, const F32& p1, const F32& p2, const F32& constant)
+    {
+        const F32 a = constant + p0;
+        const F32 b = p2 + p1;
+        return a + b;
     }
 };
 
@@ -45,9 +51,14 @@ struct TwistInTurn : frame::OnFloats {
     template <class F32> PYXCC_INLINE auto operator()(const F32& s0, const F32& s1, const F32& s2) const
     {
         const auto channel = [&](const f32* k) PYXCC_INLINE_LAMBDA {
-            return ((s0 * F32(k[0]) + s1 * F32(k[1])) + s2 * F32(k[2])) + F32(k[3]);
+            return sum(s0 * F32(k[0]), s1 * F32(k[1]), s2 * F32(k[2]), F32(k[3]));
         };
         return Three{channel(twist.k[0]), channel(twist.k[1]), channel(twist.k[2])};
+    }
+
+    template <class F32> static PYXCC_INLINE F32 sum(const F32& p0, const F32& p1, const F32& p2, const F32& constant)
+    {
+        return ((p0 + p1) + p2) + constant;
     }
 };
 
@@ -110,5 +121,85 @@ template <class Sample> struct TwistWithinIntegers : TwistOf<Sample> {
         return Three{nearest(r.a), nearest(r.b), nearest(r.c)};
     }
 };
+
+/// The same for bytes as factors, in interleaved pixels.
+template <class Byte> struct TwistOfBytes {
+    struct Channel {
+        wide::ByteWeight<Byte> k[3];
+        f32 constant;
+
+        explicit Channel(const f32* row)
+            : k{wide::ByteWeight<Byte>(row[0]), wide::ByteWeight<Byte>(row[1]), wide::ByteWeight<Byte>(row[2])},
+              constant(row[3])
+        {
+        }
+    };
+    Channel channels[3];
+
+    explicit TwistOfBytes(const f32 (*rows)[4]) : channels{Channel(rows[0]), Channel(rows[1]), Channel(rows[2])} {}
+
+    /// A weight of a factor is not to lose bits to its being small.
+    static bool suits(const f32 (*rows)[4])
+    {
+        constexpr f32 least = 0x1p-90f;
+        return TwistWithinIntegers<Byte>::suits(rows) &&
+               std::all_of(&rows[0][0], &rows[0][0] + 12, [](f32 k) { return k == 0 || std::fabs(k) >= least; });
+    }
+
+    /// One target channel of several registers of pixels.
+    template <class Factor, int N>
+    PYXCC_INLINE Several<wide::S32, N> channel(int c, const Three<Several<Factor, N>>& x) const
+    {
+        const Channel& of = channels[c];
+        const wide::ByteWeightInRegisters<Byte> k0(of.k[0]), k1(of.k[1]), k2(of.k[2]);
+        const wide::F32 constant = wide::keptInRegister(of.constant);
+        return each(
+            [&](const auto& s0, const auto& s1, const auto& s2) PYXCC_INLINE_LAMBDA {
+                return nearest(TwistOf<Byte>::sum(product(s0, k0), product(s1, k1), product(s2, k2), constant));
+            },
+            x.a, x.b, x.c);
+    }
+};
+
+/// The same in planes.
+template <class Byte> struct TwistOfPlanes : TwistOfBytes<Byte> {
+    using TwistOfBytes<Byte>::TwistOfBytes;
+    static constexpr bool storedLate = true;
+};
+
+namespace detail
+{
+
+template <class Byte, class Samples>
+PYXCC_INLINE Three<Samples> twisted(const TwistOfBytes<Byte>& form, const Three<Samples>& pixels)
+{
+    const auto factors = [](const Samples& x) PYXCC_INLINE_LAMBDA {
+        const auto four = wide::byteFactors(x);
+        return several(four.a, four.b, four.c, four.d);
+    };
+    const Three x{factors(pixels.a), factors(pixels.b), factors(pixels.c)};
+    const auto channel = [&](int c) PYXCC_INLINE_LAMBDA { return wide::saturate<Samples>(form.channel(c, x)); };
+    return {channel(0), channel(1), channel(2)};
+}
+
+} // namespace detail
+
+PYXCC_INLINE auto apply(const TwistOfPlanes<u8>& form, const Three<wide::U8>& pixels)
+{
+    return detail::twisted(form, pixels);
+}
+PYXCC_INLINE auto apply(const TwistOfPlanes<s8>& form, const Three<wide::S8>& pixels)
+{
+    return detail::twisted(form, pixels);
+}
+
+template <class Byte, class Factor>
+PYXCC_INLINE auto apply(const TwistOfBytes<Byte>& form, const Two<Three<Factor>>& pixels)
+{
+    const auto& [p, q] = pixels;
+    const Three x{several(p.a, q.a), several(p.b, q.b), several(p.c, q.c)};
+    const auto a = form.channel(0, x), b = form.channel(1, x), c = form.channel(2, x);
+    return Two{Three{a.part[0], b.part[0], c.part[0]}, Three{a.part[1], b.part[1], c.part[1]}};
+}
 
 } // namespace pyxcc::tone

@@ -176,10 +176,7 @@ template <class Depth, class Neighbours> struct LevelDiffusion {
     template <class Stage> void fetch(Stage& stage, const Band& band, int first) const
     {
         stage.fetch(band, first, [&](const u8* row, int x) {
-            typename Depth::Source sample;
-            std::memcpy(&sample, row + std::ptrdiff_t{x} * band.pixelSamples * std::ptrdiff_t{sizeof sample},
-                        sizeof sample);
-            return workingValue(sample);
+            return workingValue(layouts::sampleAt<typename Depth::Source>(row, std::ptrdiff_t{x} * band.pixelSamples));
         });
         if (!noise) {
             for (auto& ofStep : stage.thresholds) std::fill(std::begin(ofStep), std::end(ofStep), levels.step * 0.5f);

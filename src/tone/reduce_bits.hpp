@@ -10,6 +10,8 @@
 #include "tone/reduce_bits_noise.hpp"
 
 #include <algorithm>
+#include <cstdint>
+#include <optional>
 
 namespace pyxcc::tone
 {
@@ -19,38 +21,130 @@ namespace detail
 
 template <class Pixel> constexpr int samplesIn(int pixels) { return pixels * Pixel::samples; }
 
-template <class Pixel, class Depth> PyxStatus takeNearest(const ReduceBits<Depth>& call)
-{
-    using namespace layouts;
-    const RoiSize samples = {samplesIn<Pixel>(call.roi.width), call.roi.height};
-    return frame::eachRow(samples, asFloats(call.src, call.srcStep),
-                          fromFloats<typename Depth::Source, Pixel::keepsFourth>(call.dst, call.dstStep),
-                          frame::wideThenTail<8>(NearestWide<Depth>(call.levels), NearestTail<Depth>(call.levels)));
-}
-
-/// Thresholds of a row of samples, the same again after so many. Some from the front follow behind, for a block to be
-/// read from any sample on.
-struct Thresholds {
+/// What belongs to the samples of a row, the same again after `Period` of them. Some from the front follow behind, for
+/// a block to be read from any sample on.
+template <class Number, int Period> struct Recurring {
     static constexpr int block = 32;
 
-    f32 of[Noise::length * 4 + block];
-    int period;
-};
+    Number of[Period + block];
 
-template <class Source, class Row> struct RowWithThresholds {
-    static constexpr int block = Thresholds::block;
-    Row samples;
-    const Thresholds& thresholds;
+    PYXCC_INLINE const Number* from(int x) const { return of + static_cast<u32>(x) % Period; }
 
-    PYXCC_INLINE auto load(int x) const { return Two{samples.load(x), thresholdsFrom(x)}; }
-    PYXCC_INLINE auto load(int x, int count) const { return Two{samples.load(x, count), thresholdsFrom(x)}; }
-
-private:
-    PYXCC_INLINE Four<wide::F32> thresholdsFrom(int x) const
+    /// `at` gives what belongs to a pixel, of which there are so many.
+    template <class Pixel, class At> void set(int pixels, const At& at)
     {
-        return layouts::loadFloatsInOrderOf<Source>(thresholds.of + x % thresholds.period);
+        Number* out = of;
+        for (int x = 0; x < pixels; ++x) {
+            const Number number = at(x);
+            for (int i = 0; i < Pixel::samples; ++i) *out++ = number;
+        }
+        for (int i = 0, whole = samplesIn<Pixel>(pixels); i < block; ++i) out[i] = of[i % whole];
     }
 };
+
+/// Thresholds go by fours of columns, and a block may begin at any eighth one.
+template <class Pixel, class Number> using Pattern = Recurring<Number, samplesIn<Pixel>(8)>;
+
+/// `toPlace` gives what the forms take, of samples and their first column.
+template <class Row, class ToPlace> struct RowInPlace {
+    static constexpr int block = Row::block;
+    Row samples;
+    ToPlace toPlace;
+
+    PYXCC_INLINE auto load(int x) const { return toPlace(samples.load(x), x); }
+    PYXCC_INLINE auto load(int x, int count) const { return toPlace(samples.load(x, count), x); }
+};
+
+/// `placesOfRow` gives that of a row.
+template <class Image, class PlacesOfRow> struct ImageInPlace {
+    Image samples;
+    PlacesOfRow placesOfRow;
+
+    PYXCC_INLINE auto row(int y) const
+    {
+        const auto row = samples.row(y);
+        const auto toPlace = placesOfRow(y);
+        return RowInPlace<std::remove_const_t<decltype(row)>, std::remove_const_t<decltype(toPlace)>>{row, toPlace};
+    }
+};
+
+template <class Image, class PlacesOfRow> auto inPlace(const Image& samples, const PlacesOfRow& placesOfRow)
+{
+    return ImageInPlace<Image, PlacesOfRow>{samples, placesOfRow};
+}
+
+/// Columns here are samples.
+template <class Pixel, class Depth, class Source, class Plan>
+PyxStatus takeSamples(const ReduceBits<Depth>& call, const Source& source, const Plan& plan)
+{
+    return frame::eachRow({samplesIn<Pixel>(call.roi.width), call.roi.height}, source,
+                          layouts::fromFloats<typename Depth::Source, Pixel::keepsFourth>(call.dst, call.dstStep),
+                          plan);
+}
+
+/// Steps of bytes are found for a call, which pays where it has many samples.
+template <class Pixel, class Depth> bool maySeekSteps(const ReduceBits<Depth>& call)
+{
+    constexpr std::int64_t many = 16384;
+    return call.levels <= ByteSteps::most && std::int64_t{call.roi.width} * call.roi.height * Pixel::samples >= many;
+}
+
+/// Integers to bytes.
+template <class Depth>
+inline constexpr bool tellsByNumber = std::is_integral_v<typename Depth::Source> && sizeof(typename Depth::Target) == 1;
+
+template <class Pixel, class Depth> PyxStatus takeNearest(const ReduceBits<Depth>& call)
+{
+    const NearestWide<Depth> wide(call.levels);
+    const NearestTail<Depth> tail(call.levels);
+    if constexpr (std::is_same_v<Depth, tone::Depth<u8, u8>>) {
+        ByteSteps steps(call.levels - 1);
+        const auto offset = maySeekSteps<Pixel>(call)
+                                ? steps.offsetOf(ofEveryByte([&](const auto& p) { return apply(wide, p); }))
+                                : std::nullopt;
+        if (offset) {
+            Pattern<Pixel, u16> offsets;
+            offsets.template set<Pixel>(8, [&](int) { return *offset; });
+            const auto places = [&](int) {
+                return [&](const Several<wide::U8, 1>& x, int) PYXCC_INLINE_LAMBDA {
+                    return BytesInPlace{x.part[0], offsets.of, nullptr};
+                };
+            };
+            return takeSamples<Pixel>(call, inPlace(layouts::asItLies<1>(call.src, call.srcStep), places),
+                                      frame::wideThenTail<8>(SteppedBytes{steps}, tail));
+        }
+    }
+    const auto source = layouts::asFloats(call.src, call.srcStep);
+    if constexpr (tellsByNumber<Depth>) {
+        if (call.levels <= FewLevels::most)
+            return takeSamples<Pixel>(call, source, frame::wideThenTail<8>(NearestOfFew<Depth>(call.levels), tail));
+    }
+    return takeSamples<Pixel>(call, source, frame::wideThenTail<8>(wide, tail));
+}
+
+template <class Pixel, class Wide, class Tail> auto eightPixelsThenTail(const Wide& wide, const Tail& tail)
+{
+    return frame::spans([](int width) { return std::array{width - width % samplesIn<Pixel>(8), width}; }, wide, tail);
+}
+
+/// `thresholds` gives those of a row.
+template <class Pixel, class Depth, class ThresholdsOfRow>
+PyxStatus takeByThresholds(const ReduceBits<Depth>& call, const Levels& levels, const ThresholdsOfRow& thresholds)
+{
+    const auto places = [&](int y) {
+        return [&ofRow = thresholds(y)](const auto& samples, int x) PYXCC_INLINE_LAMBDA {
+            return Two{samples, layouts::loadFloatsInOrderOf<typename Depth::Source>(ofRow.from(x))};
+        };
+    };
+    const auto source = inPlace(layouts::asFloats(call.src, call.srcStep), places);
+    const OrderedTail<Depth> tail{levels};
+    if constexpr (tellsByNumber<Depth>) {
+        // Without noise the last level has nothing left above it.
+        if (call.levels < FewLevels::most || (call.levels == FewLevels::most && call.noise == 0))
+            return takeSamples<Pixel>(call, source, eightPixelsThenTail<Pixel>(OrderedOfFew<Depth>(levels), tail));
+    }
+    return takeSamples<Pixel>(call, source, eightPixelsThenTail<Pixel>(OrderedWide<Depth>{levels}, tail));
+}
 
 /// Entries of the ordered matrix, in fifteenths.
 inline constexpr f32 matrix[4][4] = {{0.0f, 8 / 15.0f, 2 / 15.0f, 10 / 15.0f},
@@ -58,62 +152,71 @@ inline constexpr f32 matrix[4][4] = {{0.0f, 8 / 15.0f, 2 / 15.0f, 10 / 15.0f},
                                      {3 / 15.0f, 11 / 15.0f, 1 / 15.0f, 9 / 15.0f},
                                      {1.0f, 7 / 15.0f, 13 / 15.0f, 5 / 15.0f}};
 
-template <class Pixel, class At> void setThresholds(Thresholds& thresholds, int pixels, const At& at)
-{
-    f32* out = thresholds.of;
-    for (int x = 0; x < pixels; ++x) {
-        const f32 threshold = at(x);
-        for (int i = 0; i < Pixel::samples; ++i) *out++ = threshold;
-    }
-    thresholds.period = samplesIn<Pixel>(pixels);
-    for (int i = 0; i < Thresholds::block; ++i) out[i] = thresholds.of[i % thresholds.period];
-}
+/// What is added to the line of steps, for each entry of the matrix. Some may be beyond it.
+struct MatrixOffsets {
+    ByteSteps steps;
+    u16 of[4][4];
 
-template <class Source, class Image, class RowThresholds> struct ImageWithThresholds {
-    Image samples;
-    RowThresholds thresholds;
-
-    PYXCC_INLINE auto row(int y) const
+    /// Whether there are any.
+    template <class Depth> bool find(const Levels& levels)
     {
-        const auto samplesOfRow = samples.row(y);
-        return RowWithThresholds<Source, std::remove_const_t<decltype(samplesOfRow)>>{samplesOfRow, thresholds(y)};
+        for (int y = 0; y < 4; ++y) {
+            for (int x = 0; x < 4; ++x) {
+                const wide::F32 threshold = levels.step * matrix[y][x];
+                const auto offset = steps.offsetOf(ofEveryByte([&](const auto& p) {
+                    return apply(OrderedWide<Depth>{levels}, Two{p, Four{threshold, threshold, threshold, threshold}});
+                }));
+                if (!offset) return false;
+                of[y][x] = *offset;
+            }
+        }
+        return true;
     }
 };
 
-/// `thresholds` gives those of a row.
-template <class Pixel, class Depth, class RowThresholds>
-PyxStatus takeByThresholds(const ReduceBits<Depth>& call, const Levels& levels, const RowThresholds& thresholds)
+template <class Pixel, class Depth>
+PyxStatus takeBySteps(const ReduceBits<Depth>& call, const Levels& levels, const MatrixOffsets& matrixOffsets,
+                      const Pattern<Pixel, f32> (&thresholds)[4])
 {
-    using namespace layouts;
-    using Source = typename Depth::Source;
-    const auto samples = asFloats(call.src, call.srcStep);
-    const ImageWithThresholds<Source, std::remove_const_t<decltype(samples)>, RowThresholds> source{samples,
-                                                                                                    thresholds};
-    const auto eightPixels = [](int width) { return std::array{width - width % samplesIn<Pixel>(8), width}; };
-    return frame::eachRow({samplesIn<Pixel>(call.roi.width), call.roi.height}, source,
-                          fromFloats<Source, Pixel::keepsFourth>(call.dst, call.dstStep),
-                          frame::spans(eightPixels, OrderedWide<Depth>{levels}, OrderedTail<Depth>{levels}));
+    Pattern<Pixel, u16> offsets[4];
+    for (int y = 0; y < 4; ++y) offsets[y].template set<Pixel>(8, [&](int x) { return matrixOffsets.of[y][x & 3]; });
+    const auto places = [&](int y) {
+        return [&ofRow = offsets[y & 3], &thresholdsOfRow = thresholds[y & 3]](const Several<wide::U8, 1>& samples,
+                                                                               int x) PYXCC_INLINE_LAMBDA {
+            return BytesInPlace{samples.part[0], ofRow.from(x), thresholdsOfRow.from(x)};
+        };
+    };
+    return takeSamples<Pixel>(
+        call, inPlace(layouts::asItLies<1>(call.src, call.srcStep), places),
+        eightPixelsThenTail<Pixel>(SteppedBytes{matrixOffsets.steps}, OrderedTail<Depth>{levels}));
 }
 
 template <class Pixel, class Depth> PyxStatus takeOrdered(const ReduceBits<Depth>& call)
 {
     const Levels levels = levelsOf<typename Depth::Source>(call.levels);
     if (call.noise == 0) {
-        Thresholds rows[4];
+        Pattern<Pixel, f32> thresholds[4];
         for (int y = 0; y < 4; ++y)
-            setThresholds<Pixel>(rows[y], 8, [&](int x) { return levels.step * matrix[y][x & 3]; });
-        return takeByThresholds<Pixel>(call, levels, [&](int y) -> const Thresholds& { return rows[y & 3]; });
+            thresholds[y].template set<Pixel>(8, [&](int x) { return levels.step * matrix[y][x & 3]; });
+        if constexpr (std::is_same_v<Depth, tone::Depth<u8, u8>>) {
+            MatrixOffsets offsets{ByteSteps(call.levels - 1), {}};
+            if (maySeekSteps<Pixel>(call) && offsets.find<Depth>(levels))
+                return takeBySteps<Pixel>(call, levels, offsets, thresholds);
+        }
+        return takeByThresholds<Pixel>(
+            call, levels, [&](int y) -> const auto& { return thresholds[y & 3]; });
     }
     const f32 amount = static_cast<f32>(call.noise);
     Noise noise;
     if (const PyxStatus failure = noise.make(-amount / 100.0f, amount / 100.0f)) return failure;
-    Thresholds ofRow;
+    Recurring<f32, samplesIn<Pixel>(Noise::length)> thresholds;
     const int pixels = std::min(call.roi.width, Noise::length);
-    return takeByThresholds<Pixel>(call, levels, [&](int y) -> const Thresholds& {
-        setThresholds<Pixel>(ofRow, pixels,
-                             [&](int x) { return levels.step * (matrix[y & 3][x & 3] + noise.at(x, y)); });
-        return ofRow;
-    });
+    return takeByThresholds<Pixel>(
+        call, levels, [&](int y) -> const auto& {
+            thresholds.template set<Pixel>(
+                pixels, [&](int x) { return levels.step * (matrix[y & 3][x & 3] + noise.at(x, y)); });
+            return thresholds;
+        });
 }
 
 template <class Pixel, class Depth> PyxStatus reduce(const ReduceBits<Depth>& call, u32 ditherType)

@@ -20,26 +20,24 @@ namespace
 
 constexpr int block = 32;
 
-/// Takes a row by blocks, most of which begin where a byte of the target does. `bitsOf(x, count)` gives the bits of
-/// some pixels from x on, the first as the highest.
-template <class BitsOf> void eachBlock(const BitRow& target, int width, const BitsOf& bitsOf)
-{
-    int x = 0;
-    const auto take = [&](int count) {
-        target.store(x, count, bitsOf(x, count));
-        x += count;
-    };
-    if (target.offset != 0) take(std::min(target.pixelsInFrontOfByte(), width));
-    while (x <= width - block) take(block);
-    if (x < width) take(width - x);
-}
-
+/// Blocks begin where a byte of the target does.
 void takeByThreshold(const u8* source, const BitRow& target, int width, u8 threshold)
 {
     const SampleRow<wide::U8, const u8> samples{source};
-    eachBlock(target, width, [&](int x, int count) PYXCC_INLINE_LAMBDA {
-        return bitsAbove(count == block ? samples.load(x) : samples.load(x, count), wide::U8(threshold));
-    });
+    const wide::U8 limit(threshold);
+    int x = 0;
+    const auto takePart = [&](int count) {
+        target.store(x, count, bitsAbove(samples.load(x, count), limit));
+        x += count;
+    };
+    if (target.offset != 0) takePart(std::min(target.pixelsInFrontOfByte(), width));
+    const auto take = [&](int at) PYXCC_INLINE_LAMBDA { target.store(at, bitsAbove(samples.load(at), limit)); };
+    for (; x <= width - 4 * block; x += 4 * block) {
+        expectFrom<expectedLoads>(source + x);
+        for (int i = 0; i < 4; ++i) take(x + i * block);
+    }
+    for (; x <= width - block; x += block) take(x);
+    if (x < width) takePart(width - x);
 }
 
 /// Errors are eighths of a sample's unit, spread by 42nds. A set bit pays 2047 of them, where white gains 2040. All

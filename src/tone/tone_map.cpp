@@ -5,19 +5,49 @@
 #include "frame/plane_service.hpp"
 #include "frame/row_driver.hpp"
 #include "layouts/gray_images.hpp"
+#include "layouts/streamed_images.hpp"
 #include "tone/tone_map_forms.hpp"
 #include "tone/tone_map_statistics.hpp"
 
+#include <algorithm>
 #include <cstdint>
-#include <cstring>
 #include <limits>
 
+using namespace pyxcc;
 using namespace pyxcc::frame;
 using namespace pyxcc::layouts;
 using namespace pyxcc::tone;
 
 namespace
 {
+
+/// A row of floats on their way to bytes. The row that is taken next lies somewhere else, and is expected there.
+struct FloatsOfRow {
+    static constexpr int block = wide::U8::count;
+    const u8* at;
+    std::ptrdiff_t toNextRow;
+
+    PYXCC_INLINE auto load(int x) const
+    {
+        const u8* const p = at + std::ptrdiff_t{x} * 4;
+        expectFrom<0>(p + toNextRow);
+        return FloatsForBytes::load(p);
+    }
+
+    PYXCC_INLINE auto load(int x, int count) const { return floatsForBytes(at).load(x, count); }
+};
+
+/// The image of a call. Rows of the source begin a whole number of samples from the first, whatever the step.
+struct Images {
+    const f32* src;
+    int srcStep;
+    u8* dst;
+    int dstStep;
+    RoiSize roi;
+
+    const u8* source(int y) const { return bytes(src) + (std::ptrdiff_t{srcStep} * y & ~std::ptrdiff_t{3}); }
+    u8* target(int y) const { return rowAt(dst, dstStep, y); }
+};
 
 /// Where source and target share memory the result is that of one sample after the other. Blocks give the same unless
 /// the target's row begins among the source's samples, and so is ahead of their reading.
@@ -29,24 +59,57 @@ bool runsAheadOf(const u8* source, const u8* target, int width)
 
 template <class Form> void mapOneByOne(const u8* source, u8* target, int width, const Form& form)
 {
-    for (int x = 0; x < width; ++x) {
-        f32 sample;
-        std::memcpy(&sample, source + std::ptrdiff_t{x} * 4, sizeof sample);
-        target[x] = pyxcc::scalar::saturate<u8>(form(pyxcc::scalar::F32(sample)));
+    for (int x = 0; x < width; ++x) target[x] = scalar::saturate<u8>(form(scalar::F32(sampleAt<f32>(source, x))));
+}
+
+/// Rows from top to bottom, as they may share memory.
+template <class Form> void mapDownwards(const Images& images, const Form& form)
+{
+    for (int y = 0; y < images.roi.height; ++y) {
+        const u8* const source = images.source(y);
+        u8* const target = images.target(y);
+        if (runsAheadOf(source, target, images.roi.width)) {
+            mapOneByOne(source, target, images.roi.width, form);
+        } else {
+            convertColumns(floatsForBytes(source), bytesOfFloats(target), 0, images.roi.width, form);
+        }
     }
 }
 
-/// Rows of the source begin a whole number of samples from the first, whatever the step.
-template <class Form> void mapSamples(const f32* src, int srcStep, u8* dst, int dstStep, RoiSize roi, const Form& form)
+/// Rows from bottom to top: what the statistic has read last is still near. The target goes past the cache, which it
+/// would only take from the source.
+template <class Form> void mapUpwards(const Images& images, const Form& form)
 {
-    for (int y = 0; y < roi.height; ++y) {
-        const u8* const source = bytes(src) + (std::ptrdiff_t{srcStep} * y & ~std::ptrdiff_t{3});
-        u8* const target = rowAt(dst, dstStep, y);
-        if (runsAheadOf(source, target, roi.width)) {
-            mapOneByOne(source, target, roi.width, form);
-        } else {
-            convertColumns(floatsForBytes(source), bytesOfFloats(target), 0, roi.width, form);
-        }
+    for (int y = images.roi.height - 1; y >= 0; --y) {
+        const u8* const source = images.source(y);
+        const FloatsOfRow from{source, images.source(std::max(y - 1, 0)) - source};
+        const StreamedRow<decltype(bytesOfFloats(images.target(y)))> to{bytesOfFloats(images.target(y))};
+        const int aligned = std::min(to.firstAligned(), images.roi.width);
+        convertColumns(from, to, 0, aligned, form);
+        convertColumns(from, to, aligned, images.roi.width, form);
+    }
+    fenceStreams();
+}
+
+/// Whether an image is larger than the nearer caches, and takes up memory that the target has no part of. Rows of a
+/// target may share memory as well, and then the last of them counts.
+bool allowsUpwards(const Images& images)
+{
+    const auto [src, srcStep, dst, dstStep, roi] = images;
+    constexpr std::int64_t nearCaches = 2 << 20;
+    const std::int64_t width = roi.width, height = roi.height;
+    if (width * height * 4 < nearCaches || srcStep < width * 4 || dstStep < width) return false;
+    const auto s = reinterpret_cast<std::uintptr_t>(src), d = reinterpret_cast<std::uintptr_t>(dst);
+    return d + static_cast<std::uint64_t>(dstStep * height) <= s ||
+           s + static_cast<std::uint64_t>(srcStep * height) <= d;
+}
+
+template <class Form> void mapSamples(const Images& images, const Form& form)
+{
+    if (allowsUpwards(images)) {
+        mapUpwards(images, form);
+    } else {
+        mapDownwards(images, form);
     }
 }
 
@@ -55,7 +118,7 @@ PyxStatus mapByLevel(Level level, const f32* src, int srcStep, u8* dst, int dstS
 {
     if (level < 0) return pyxWarnNegativeLevel;
     if (level > std::numeric_limits<f32>::min()) {
-        mapSamples(src, srcStep, dst, dstStep, roi, Form{static_cast<f32>(255 / level)});
+        mapSamples(Images{src, srcStep, dst, dstStep, roi}, Form{static_cast<f32>(255 / level)});
     } else {
         fillPlane8u(0, dst, dstStep, roi.width, roi.height);
     }

@@ -28,54 +28,47 @@ PYXCC_INLINE Block loadBlock(const u8* row, int x)
     return samples;
 }
 
-f32 sampleAt(const u8* row, int x)
-{
-    f32 sample;
-    std::memcpy(&sample, row + std::ptrdiff_t{x} * 4, sizeof sample);
-    return sample;
-}
-
 f32 largerOrLater(f32 level, f32 sample) { return level > sample ? level : sample; }
 
-/// The largest of the row's whole blocks in `level`, unless a sample is infinite or NaN.
-bool largestOfBlocks(const u8* row, int width, f32& level)
+/// One sample after the other.
+f32 largestInTurn(const f32* src, int srcStep, RoiSize roi)
 {
-    Block best(std::numeric_limits<f32>::lowest()), zeros(0.0f);
-    for (int x = 0; x <= width - block; x += block) {
-        const Block samples = loadBlock(row, x);
-        best = greater(best, samples);
-        zeros = fused(samples, Block(0.0f), zeros); // NaN from the first such sample on
+    f32 level = std::numeric_limits<f32>::lowest();
+    for (int y = 0; y < roi.height; ++y) {
+        const u8* const row = layouts::rowAt(layouts::bytes(src), srcStep, y);
+        for (int x = 0; x < roi.width; ++x) level = largerOrLater(level, layouts::sampleAt<f32>(row, x));
     }
-    f32 lanes[block], checks[block];
-    std::memcpy(lanes, &best, sizeof lanes);
-    std::memcpy(checks, &zeros, sizeof checks);
-    for (int i = 0; i < block; ++i) {
-        if (!(checks[i] == 0)) return false;
-        level = largerOrLater(level, lanes[i]);
-    }
-    return true;
-}
-
-f32 largestOfRow(const u8* row, int width, f32 level)
-{
-    f32 ofBlocks = level;
-    int x = 0;
-    if (width >= block && largestOfBlocks(row, width, ofBlocks)) {
-        level = ofBlocks;
-        x = width & ~(block - 1);
-    }
-    for (; x < width; ++x) level = largerOrLater(level, sampleAt(row, x));
     return level;
 }
 
 } // namespace
 
+/// Which of finite samples is the largest does not depend on their order.
 f32 largestSample(const f32* src, int srcStep, RoiSize roi)
 {
-    f32 level = std::numeric_limits<f32>::lowest();
-    for (int y = 0; y < roi.height; ++y)
-        level = largestOfRow(layouts::rowAt(layouts::bytes(src), srcStep, y), roi.width, level);
-    return level;
+    Block best(std::numeric_limits<f32>::lowest()), zeros(0.0f); // zeros: NaN from the first that is not finite on
+    f32 level = std::numeric_limits<f32>::lowest(), zero = 0;
+    for (int y = 0; y < roi.height; ++y) {
+        const u8* const row = layouts::rowAt(layouts::bytes(src), srcStep, y);
+        int x = 0;
+        for (; x <= roi.width - block; x += block) {
+            const Block samples = loadBlock(row, x);
+            best = greater(best, samples);
+            zeros = fused(samples, Block(0.0f), zeros);
+        }
+        for (; x < roi.width; ++x) {
+            level = largerOrLater(level, layouts::sampleAt<f32>(row, x));
+            zero += layouts::sampleAt<f32>(row, x) * 0;
+        }
+    }
+    f32 lanes[block], checks[block];
+    std::memcpy(lanes, &best, sizeof lanes);
+    std::memcpy(checks, &zeros, sizeof checks);
+    for (int i = 0; i < block; ++i) {
+        level = largerOrLater(level, lanes[i]);
+        zero += checks[i];
+    }
+    return zero == 0 ? level : largestInTurn(src, srcStep, roi);
 }
 
 f64 sumOfSamples(const f32* src, int srcStep, RoiSize roi)
@@ -86,7 +79,7 @@ f64 sumOfSamples(const f32* src, int srcStep, RoiSize roi)
         const u8* const row = layouts::rowAt(layouts::bytes(src), srcStep, y);
         int x = 0;
         for (; x <= roi.width - block; x += block) sums = sums + toF64(loadBlock(row, x));
-        for (; x < roi.width; ++x) sum += static_cast<f64>(sampleAt(row, x));
+        for (; x < roi.width; ++x) sum += static_cast<f64>(layouts::sampleAt<f32>(row, x));
     }
     f64 lanes[block];
     std::memcpy(lanes, &sums, sizeof lanes);

@@ -1,5 +1,5 @@
 #include "tone/color_twist_forms.hpp"
-#include "layouts/avx2/interleave.hpp"
+#include "layouts/float_images.hpp"
 
 #include <gtest/gtest.h>
 
@@ -125,6 +125,61 @@ TYPED_TEST(IntegerTwist, FormsAgreeWithinIntegers)
         ASSERT_EQ(throughRegister<TypeParam>(Form(twist), samples), told) << "matrix " << i;
     }
     EXPECT_GT(suited, 1000);
+}
+
+/// Where the matrix suits factors, bytes as factors give what converted bytes give: in planes, and interleaved.
+template <class Byte> void expectFactorsAgree()
+{
+    using Samples = wide::RegisterOf<Byte>;
+    using Interleaved = layouts::C3Sixteens<Byte>;
+    int suited = 0;
+    for (int i = 0; i < 20000; ++i) {
+        f32 twist[3][4];
+        fill(twist, std::numeric_limits<Byte>::max());
+        if (!TwistOfBytes<Byte>::suits(twist)) continue;
+        ++suited;
+        const auto samples = randomSamples<Byte>();
+        const auto told = oneByOne<Byte>(TwistToInteger<Byte>(twist), samples);
+
+        const auto load = [&](int c) {
+            return layouts::loadSamples<Samples>(reinterpret_cast<const u8*>(samples[c].data()));
+        };
+        const Three<Samples> x = apply(TwistOfPlanes<Byte>(twist), Three{load(0), load(1), load(2)});
+        Channels<Byte, 3> found;
+        layouts::storeSamples(reinterpret_cast<u8*>(found[0].data()), x.a);
+        layouts::storeSamples(reinterpret_cast<u8*>(found[1].data()), x.b);
+        layouts::storeSamples(reinterpret_cast<u8*>(found[2].data()), x.c);
+        ASSERT_EQ(found, told) << "planes, matrix " << i;
+
+        for (int first = 0; first < 32; first += 16) {
+            u8 pixels[48];
+            for (int k = 0; k < 48; ++k) pixels[k] = static_cast<u8>(samples[k % 3][first + k / 3]);
+            Interleaved::store(pixels, apply(TwistOfBytes<Byte>(twist), Interleaved::load(pixels)));
+            for (int k = 0; k < 48; ++k)
+                ASSERT_EQ(pixels[k], static_cast<u8>(told[k % 3][first + k / 3])) << "matrix " << i << ", byte " << k;
+        }
+    }
+    EXPECT_GT(suited, 1000);
+}
+
+TEST(TwistOfBytes, FactorsAgreeWithConvertedBytes)
+{
+    expectFactorsAgree<u8>();
+    expectFactorsAgree<s8>();
+}
+
+/// Weights that a 2^24th part of which would not be exact, and those that the other forms are for as well.
+TEST(TwistOfBytes, SuitsNoWeightsThatAreTooSmallOrTooLarge)
+{
+    const f32 usual[3][4] = {{0.5f, 0, 0x1p-90f, -1}, {-0x1p-90f, 0, 0, 0}, {1, 2, 3, 0}};
+    const f32 small[3][4] = {{0.5f, 0, 0x1p-91f, -1}, {0, 0, 0, 0}, {1, 2, 3, 0}};
+    const f32 large[3][4] = {{0.5f, 0, 0, -1}, {0, 0, 0, 0x1p30f}, {1, 2, 3, 0}};
+    const f32 noNumber[3][4] = {{0.5f, 0, 0, -1}, {0, 0, std::numeric_limits<f32>::quiet_NaN(), 0}, {1, 2, 3, 0}};
+    EXPECT_TRUE(TwistOfBytes<s8>::suits(usual));
+    EXPECT_TRUE(TwistOfBytes<u8>::suits(usual));
+    EXPECT_FALSE(TwistOfBytes<s8>::suits(small));
+    EXPECT_FALSE(TwistOfBytes<u8>::suits(large));
+    EXPECT_FALSE(TwistOfBytes<s8>::suits(noNumber));
 }
 
 TYPED_TEST(IntegerTwist, ResultsBeyondIntegersAreHeldByTheOtherForm)

@@ -3,7 +3,7 @@
 #include "rounding_modes.hpp"
 
 #include "tone/diffusion.hpp"
-#include "tone/reduce_bits_forms.hpp"
+#include "tone/reduce_bits.hpp"
 
 #include <gtest/gtest.h>
 
@@ -115,6 +115,111 @@ TYPED_TEST(ReduceBitsForm, InstancesAgreeOnEverySample)
         expectInstancesAgree<TypeParam>(OrderedWide<TypeParam>{levels}, levels.step);
         expectInstancesAgree<TypeParam>(OrderedTail<TypeParam>{levels}, levels.step);
     }
+}
+
+/// Forms of few levels give what the others give, in registers as these do.
+template <class Depth> void expectFewAreAsMany(s32 count)
+{
+    if constexpr (std::is_integral_v<typename Depth::Source> && sizeof(typename Depth::Target) == 1) {
+        using Source = typename Depth::Source;
+        const auto samples = everySample<Source>();
+        for (const int mode : forms::roundingModes) {
+            for (std::size_t first = 0; first < samples.size(); first += 32) {
+                u8 few[32], many[32];
+                const auto expectEqual = [&](const char* form, f32 threshold) {
+                    for (std::size_t i = 0; i < 32; ++i)
+                        ASSERT_EQ(few[i], many[i]) << form << ", sample " << +samples[first + i] << ", mode " << mode
+                                                   << ", threshold " << threshold << " of " << count << " levels";
+                };
+                forms::roundingBy(mode, [&] {
+                    throughRegisters<Depth>(NearestOfFew<Depth>(count), &samples[first], nullptr, few);
+                    oneByOne<Depth>(NearestWide<Depth>(count), &samples[first], nullptr, many);
+                });
+                ASSERT_NO_FATAL_FAILURE(expectEqual("nearest", 0));
+                const Levels levels = levelsOf<Source>(count);
+                for (int k = count == 16 ? 0 : -15; k <= 30; ++k) { // of one more level than 15, without noise alone
+                    f32 thresholds[32];
+                    std::fill_n(thresholds, 32, levels.step * (static_cast<f32>(k) / 15.0f));
+                    forms::roundingBy(mode, [&] {
+                        const Levels ofMode = levelsOf<Source>(count);
+                        throughRegisters<Depth>(OrderedOfFew<Depth>(ofMode), &samples[first], thresholds, few);
+                        oneByOne<Depth>(OrderedWide<Depth>{ofMode}, &samples[first], thresholds, many);
+                    });
+                    ASSERT_NO_FATAL_FAILURE(expectEqual("ordered", thresholds[0]));
+                }
+            }
+        }
+    }
+}
+
+TYPED_TEST(ReduceBitsForm, FewLevelsAreAsMany)
+{
+    for (const s32 count : {2, 3, 4, 7, 8, 15, 16}) ASSERT_NO_FATAL_FAILURE(expectFewAreAsMany<TypeParam>(count));
+}
+
+using Bytes = Depth<u8, u8>;
+
+/// A line that is found tells a function of bytes exactly, in registers as well.
+void expectTold(const ByteSteps& steps, u16 offset, const ByteFunction& function)
+{
+    std::array<u16, 32> offsets;
+    offsets.fill(offset);
+    for (int x = 0; x < 256; ++x) ASSERT_EQ(lookUp(steps, static_cast<u8>(x), offset), function[x]) << x;
+    ByteFunction bytes, results;
+    std::iota(bytes.begin(), bytes.end(), u8{0});
+    for (int x = 0; x < 256; x += 32) {
+        const auto samples = layouts::loadSamples<wide::U8>(&bytes[x]);
+        layouts::storeSamples(&results[x], lookUp(steps, samples, layouts::loadWordsInOrderOfBytes(offsets.data())));
+    }
+    ASSERT_EQ(results, function);
+}
+
+/// Without a line for each the faster way would not be taken, which no result would tell.
+TEST(ByteSteps, TellFewLevelsOfBytes)
+{
+    for (const s32 count : {2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12, 13, 14, 15, 16}) {
+        SCOPED_TRACE(count);
+        ByteSteps nearest(count - 1);
+        ByteFunction function;
+        for (int x = 0; x < 256; ++x)
+            function[x] = storedOf<u8>(NearestWide<Bytes>(count)(scalar::F32(static_cast<f32>(x))));
+        const auto offset = nearest.offsetOf(function);
+        ASSERT_TRUE(offset);
+        ASSERT_NO_FATAL_FAILURE(expectTold(nearest, *offset, function));
+
+        ByteSteps ordered(count - 1);
+        const Levels levels = levelsOf<u8>(count);
+        for (int k = 0; k < 16; ++k) {
+            const scalar::F32 threshold = levels.step * tone::detail::matrix[k / 4][k % 4];
+            for (int x = 0; x < 256; ++x)
+                function[x] = storedOf<u8>(OrderedWide<Bytes>{levels}(scalar::F32(static_cast<f32>(x)), threshold));
+            const auto offsetOfEntry = ordered.offsetOf(function);
+            ASSERT_TRUE(offsetOfEntry) << "entry " << k;
+            ASSERT_NO_FATAL_FAILURE(expectTold(ordered, *offsetOfEntry, function));
+        }
+    }
+}
+
+/// Half of 256 bytes at 0 and half at 255 are a step; what goes down again, or up where there is no room, is none.
+TEST(ByteSteps, RefuseOtherFunctions)
+{
+    ByteFunction half = {}, other;
+    std::fill(half.begin() + 128, half.end(), u8{255});
+    EXPECT_TRUE(ByteSteps(1).offsetOf(half));
+
+    other = half;
+    other[255] = 0;
+    EXPECT_FALSE(ByteSteps(1).offsetOf(other)) << "down again";
+    std::iota(other.begin(), other.end(), u8{0});
+    EXPECT_FALSE(ByteSteps(15).offsetOf(other)) << "256 values";
+    other = half;
+    std::fill(other.begin() + 130, other.end(), u8{7});
+    EXPECT_FALSE(ByteSteps(2).offsetOf(other)) << "two steps, of which one takes two bytes";
+
+    ByteSteps shared(1);
+    EXPECT_TRUE(shared.offsetOf(half));
+    std::fill(half.begin() + 128, half.end(), u8{254});
+    EXPECT_FALSE(shared.offsetOf(half)) << "another value of the same step";
 }
 
 /// An image of one channel through a diffusion by bands of so many rows.

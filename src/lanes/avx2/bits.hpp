@@ -9,11 +9,12 @@ namespace pyxcc::wide
 /// A bit for each sample above the threshold, that of the first sample highest.
 PYXCC_INLINE u32 bitsAbove(U8 x, U8 threshold)
 {
-    const __m256i backwards = _mm256_setr_epi8(15, 14, 13, 12, 11, 10, 9, 8, 7, 6, 5, 4, 3, 2, 1, 0, 15, 14, 13, 12, 11,
-                                               10, 9, 8, 7, 6, 5, 4, 3, 2, 1, 0);
-    const __m256i inLanes = _mm256_shuffle_epi8(_mm256_subs_epu8(x.v, threshold.v), backwards);
-    const __m256i excess = _mm256_permute2x128_si256(inLanes, inLanes, 0x01);
-    return ~static_cast<u32>(_mm256_movemask_epi8(_mm256_cmpeq_epi8(excess, _mm256_setzero_si256())));
+    // Eights are reversed before their bits are taken, and the bytes of bits then: what is stored is reversed back.
+    const __m256i reversedEights = _mm256_setr_epi8(7, 6, 5, 4, 3, 2, 1, 0, 15, 14, 13, 12, 11, 10, 9, 8, 7, 6, 5, 4, 3,
+                                                    2, 1, 0, 15, 14, 13, 12, 11, 10, 9, 8);
+    const __m256i excess = _mm256_shuffle_epi8(_mm256_subs_epu8(x.v, threshold.v), reversedEights);
+    const __m256i isNone = _mm256_cmpeq_epi8(excess, _mm256_setzero_si256());
+    return __builtin_bswap32(~static_cast<u32>(_mm256_movemask_epi8(isNone)));
 }
 
 } // namespace pyxcc::wide

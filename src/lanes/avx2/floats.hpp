@@ -75,6 +75,12 @@ PYXCC_INLINE S32 nearest(F32 x) { return S32(_mm256_cvtps_epi32(x.v)); }
 /// To an integer towards zero; out of range and NaN give the lowest integer.
 PYXCC_INLINE S32 trunc(F32 x) { return S32(_mm256_cvttps_epi32(x.v)); }
 
+/// x < y ? n + 1 : n.
+PYXCC_INLINE S32 oneMoreWhereLess(F32 x, F32 y, S32 n)
+{
+    return S32(_mm256_sub_epi32(n.v, _mm256_castps_si256(_mm256_cmp_ps(x.v, y.v, _CMP_LT_OQ))));
+}
+
 namespace detail
 {
 
@@ -98,6 +104,16 @@ PYXCC_INLINE Four<F32> toF32(U8 x)
     const Two<F32> low = toF32(U16(_mm256_unpacklo_epi8(x.v, zero)));
     const Two<F32> high = toF32(U16(_mm256_unpackhi_epi8(x.v, zero)));
     return {low.a, low.b, high.a, high.b};
+}
+
+/// The same by a difference in place of a conversion, for loops that are short of the units for conversions and
+/// products. Where the mode is to round down, a zero becomes -0.
+PYXCC_INLINE Two<F32> toF32ByDifference(U16 x)
+{
+    const __m256i exponent = _mm256_set1_epi16(0x4b00); // of 2^23
+    const auto floats = [](__m256i offset)
+                            PYXCC_INLINE_LAMBDA { return F32(_mm256_castsi256_ps(offset)) - F32(0x1p23f); };
+    return {floats(_mm256_unpacklo_epi16(x.v, exponent)), floats(_mm256_unpackhi_epi16(x.v, exponent))};
 }
 
 /// What zero-extended signed bytes are to differ by, bit by bit, to be floats 2^23 + 128 greater than they.

@@ -16,8 +16,8 @@ template <class Sample> PYXCC_INLINE Four<wide::F32> loadAsFloats(const u8* p)
                 loadSamples<wide::F32>(p + 96)};
     } else if constexpr (sizeof(Sample) == 2) {
         const auto words = [](const u8* at) PYXCC_INLINE_LAMBDA {
-            if constexpr (std::is_signed_v<Sample>) return toF32(raised(loadSamples<wide::S16>(at)));
-            return toF32(loadSamples<wide::U16>(at));
+            if constexpr (std::is_signed_v<Sample>) return toF32ByDifference(raised(loadSamples<wide::S16>(at)));
+            return toF32ByDifference(loadSamples<wide::U16>(at));
         };
         const Two<wide::F32> low = words(p), high = words(p + 32);
         return {low.a, low.b, high.a, high.b};
@@ -39,6 +39,16 @@ template <class Sample> PYXCC_INLINE Four<wide::F32> loadFloatsInOrderOf(const f
     } else {
         return {fours(0, 16), fours(4, 20), fours(8, 24), fours(12, 28)};
     }
+}
+
+/// Reads 32 words in the order of widened bytes.
+PYXCC_INLINE Two<wide::U16> loadWordsInOrderOfBytes(const u16* p)
+{
+    const auto eights = [p](int low, int high) PYXCC_INLINE_LAMBDA {
+        const auto eight = [p](int at) { return _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + at)); };
+        return wide::U16(_mm256_set_m128i(eight(high), eight(low)));
+    };
+    return {eights(0, 16), eights(8, 24)};
 }
 
 /// A register that integers of the order of `Sample` were narrowed to, in the order of memory.
