@@ -8,11 +8,15 @@ namespace pyxcc::tone
 {
 
 /// The curves over doubles from 0 to 1 and beyond: a line of this slope below the threshold, and from there, for NaN
-/// too, what curved() says.
+/// too, what curved() says; curvedOfWords() does for words.
 struct ForwardCurve {
     static constexpr f64 threshold = 0.018;
     static constexpr f64 slope = 4.5;
     template <class F64> static PYXCC_INLINE F64 curved(const F64& x) { return fused(power045(x), 1.099, -0.099); }
+    template <class F64> static PYXCC_INLINE F64 curvedOfWords(const F64& x)
+    {
+        return fused(power045OfWords(x), 1.099, -0.099);
+    }
 };
 
 struct InverseCurve {
@@ -21,6 +25,10 @@ struct InverseCurve {
     template <class F64> static PYXCC_INLINE F64 curved(const F64& x)
     {
         return power222((x + 0.099) * 0.9099181073703366); // one unit in the last place from 1 / 1.099
+    }
+    template <class F64> static PYXCC_INLINE F64 curvedOfWords(const F64& x)
+    {
+        return power222OfWords((x + 0.099) * 0.9099181073703366);
     }
 };
 
@@ -39,7 +47,7 @@ template <class Curve> struct GammaOfWords : frame::OnSamples {
     {
         const auto v = toF64(samples);
         const auto x = v * 1.5259021896696422e-5;
-        const auto curved = Curve::curved(greater(Curve::threshold, x)) * 65535.0;
+        const auto curved = Curve::curvedOfWords(greater(Curve::threshold, x)) * 65535.0;
         const auto z = toF32(whereLess(x, Curve::threshold, v * Curve::slope, curved) + 0.5);
         const auto t = trunc(z);
         return whereEqual(z, toF32(t), t & ~1, t);

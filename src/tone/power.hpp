@@ -31,6 +31,9 @@ inline constexpr CoarsePower near045 = {
 inline constexpr CoarsePower near222 = {
     0.22222222f, {1.00006301f, 0.21980145f, -0.07162767f, 0.01836575f}, 0x1p-53f * 8 / 9 * excessUnit};
 
+/// x^(-1/9), for powers of words.
+inline constexpr CoarsePower near222OfWords = {-0.11111111f, {0.99993195f, -0.10876627f, 0.04809288f, -0.01343126f}, 0};
+
 template <class F64> struct Coarse {
     F64 power;  ///< 13 bits, off by less than 1 / 6000
     F64 excess; ///< excess * log x, where log2 x is off by less than 0.09
@@ -91,6 +94,34 @@ template <class F64> PYXCC_INLINE F64 power222(const F64& w)
         near.excess);
     const F64 y = square * z, below = fused(square, z, -y);
     return finiteOr(w, y + fused(y, c, fused(rest, z, below)));
+}
+
+// A word has 16 bits, and its rounding looks at no more than 24: powers that are off by less than 2^-40 give every word
+// that exact ones do. With z^20 x, or z^9 x, being 1 + e as above, x^0.45 is x (1 + e)^(-11/20) z^11, and x^2.22... is
+// x^3 (1 + e)^(-7/9) z^7: no root, and no quotient.
+
+/// y (1 + e)^p for small e, by its first coefficients.
+template <class F64> PYXCC_INLINE F64 corrected(const F64& y, const F64& e, const double (&k)[4])
+{
+    const F64 e2 = e * e;
+    return fused(y, fused(e2, fused(e, k[3], k[2]), fused(e, k[1], k[0])) * e, y);
+}
+
+/// x^0.45, for x from 0.018 to 1.
+template <class F64> PYXCC_INLINE F64 power045OfWords(const F64& x)
+{
+    const F64 z = coarse(x, near045).power, z2 = z * z, z4 = z2 * z2, z8 = z4 * z4;
+    const F64 e = fused(z8 * z8 * z4, x, -1.0);
+    return corrected(z8 * x * (z2 * z), e, {-0.55, 0.42625, -0.3623125, 0.32155234375});
+}
+
+/// w^2.2222222222222223, for w from 0.16 to 1.
+template <class F64> PYXCC_INLINE F64 power222OfWords(const F64& w)
+{
+    const F64 z = coarse(w, near222OfWords).power, z2 = z * z, z4 = z2 * z2;
+    const F64 e = fused(z4 * z4 * z, w, -1.0);
+    return corrected(w * w * w * (z4 * (z2 * z)), e,
+                     {-0.7777777777777778, 0.691358024691358, -0.6401463191586648, 0.6045826347609612});
 }
 
 } // namespace pyxcc::tone
