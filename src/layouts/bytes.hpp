@@ -36,6 +36,14 @@ template <int Distance, int Lines = 2> PYXCC_INLINE void expectFrom(const u8* p)
 /// How far ahead of its loads and of its stores a loop hints that does hardly more than copy.
 inline constexpr int expectedLoads = 4096, expectedStores = 2048;
 
+/// Rows hint that far. Those of a pair hint at what is near: whatever the upper one hints at behind its end is the
+/// lower one, which is under way already, and the start of a row that nobody hinted at is the longer the farther they
+/// look.
+enum class Hints { far, near };
+
+template <Hints hints> inline constexpr int hintedLoads = hints == Hints::far ? expectedLoads : 512;
+template <Hints hints> inline constexpr int hintedStores = hints == Hints::far ? expectedStores : 256;
+
 /// Copies a partial block: few bytes, where a call of memcpy would cost more than the copy.
 void copyBytes(u8* to, const u8* from, int count);
 

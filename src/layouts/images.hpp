@@ -30,13 +30,13 @@ template <class Packing, class Byte> struct InterleavedImage {
     std::ptrdiff_t step;
     Packing packing;
 
-    PYXCC_INLINE auto row(int y) const
+    template <Hints hints = Hints::far> PYXCC_INLINE auto row(int y) const
     {
-        return InterleavedRow<Packing, Byte>{rowAt(first, step, y), packingOfRow(packing, y)};
+        return InterleavedRow<Packing, Byte, hints>{rowAt(first, step, y), packingOfRow(packing, y)};
     }
 
     /// Rows 2 j and 2 j + 1.
-    PYXCC_INLINE auto rowPair(int j) const { return RowPair{row(2 * j), row(2 * j + 1)}; }
+    PYXCC_INLINE auto rowPair(int j) const { return RowPair{row<Hints::near>(2 * j), row<Hints::near>(2 * j + 1)}; }
 
     /// The same pair where it has no second row.
     PYXCC_INLINE auto halfPair(int j) const { return row(2 * j); }
@@ -46,15 +46,15 @@ template <class Samples, class Byte, int Planes> struct PlanarImage {
     std::array<Byte*, Planes> first;
     std::array<std::ptrdiff_t, Planes> step;
 
-    PYXCC_INLINE auto row(int y) const
+    template <bool oneOfTwo = false> PYXCC_INLINE auto row(int y) const
     {
-        PlanarRow<Samples, Byte, Planes> rows;
+        PlanarRow<Samples, Byte, Planes, oneOfTwo> rows;
         for (int i = 0; i < Planes; ++i) rows.plane[i] = {rowAt(first[i], step[i], y)};
         return rows;
     }
 
     /// Rows 2 j and 2 j + 1.
-    PYXCC_INLINE auto rowPair(int j) const { return RowPair{row(2 * j), row(2 * j + 1)}; }
+    PYXCC_INLINE auto rowPair(int j) const { return RowPair{row<true>(2 * j), row<true>(2 * j + 1)}; }
 };
 
 namespace detail

@@ -117,7 +117,7 @@ template <class Packing> inline constexpr int blockOf = Packing::Samples::count;
 template <class Register, int PixelSamples>
 inline constexpr int blockOf<AsTheyLie<Register, PixelSamples>> = AsTheyLie<Register, PixelSamples>::block;
 
-template <class Packing, class Byte> struct InterleavedRow {
+template <class Packing, class Byte, Hints hints = Hints::far> struct InterleavedRow {
     static constexpr int block = blockOf<Packing>;
     static constexpr int pixelBytes = Packing::pixelBytes;
     Byte* at;
@@ -125,7 +125,7 @@ template <class Packing, class Byte> struct InterleavedRow {
 
     PYXCC_INLINE auto load(int x) const
     {
-        expectFrom<4096>(pixel(x));
+        expectFrom<hintedLoads<hints>>(pixel(x));
         return packing.load(pixel(x));
     }
 
@@ -141,7 +141,7 @@ template <class Packing, class Byte> struct InterleavedRow {
 
     template <class Pixels> PYXCC_INLINE void store(int x, const Pixels& pixels) const
     {
-        expectFrom<2048>(pixel(x));
+        expectFrom<hintedStores<hints>>(pixel(x));
         packing.store(pixel(x), pixels);
     }
 
@@ -156,12 +156,16 @@ template <class Packing, class Byte> struct InterleavedRow {
     PYXCC_INLINE Byte* pixel(int x) const { return at + static_cast<std::ptrdiff_t>(x) * pixelBytes; }
 };
 
-/// A row of one plane of samples.
-template <class Samples, class Byte> struct SampleRow {
+/// A row of one plane of samples. One of two that are taken together hints ahead.
+template <class Samples, class Byte, bool oneOfTwo = false> struct SampleRow {
     static constexpr int block = Samples::count;
     Byte* at;
 
-    PYXCC_INLINE Samples load(int x) const { return loadSamples<Samples>(sample(x)); }
+    PYXCC_INLINE Samples load(int x) const
+    {
+        if constexpr (oneOfTwo) expectFrom<hintedStores<Hints::near>, 1>(sample(x));
+        return loadSamples<Samples>(sample(x));
+    }
 
     PYXCC_INLINE Samples load(int x, int count) const
     {
@@ -170,7 +174,11 @@ template <class Samples, class Byte> struct SampleRow {
         return loadSamples<Samples>(buffer);
     }
 
-    PYXCC_INLINE void store(int x, Samples samples) const { storeSamples(sample(x), samples); }
+    PYXCC_INLINE void store(int x, Samples samples) const
+    {
+        if constexpr (oneOfTwo) expectFrom<hintedStores<Hints::near>, 1>(sample(x));
+        storeSamples(sample(x), samples);
+    }
 
     PYXCC_INLINE void store(int x, int count, Samples samples) const
     {
@@ -184,10 +192,10 @@ private:
 };
 
 /// A row of each of three planes of samples, all of one width, or of four.
-template <class Samples, class Byte, int Planes> struct PlanarRow {
+template <class Samples, class Byte, int Planes, bool oneOfTwo = false> struct PlanarRow {
     static_assert(Planes == 3 || Planes == 4);
     static constexpr int block = Samples::count;
-    std::array<SampleRow<Samples, Byte>, Planes> plane;
+    std::array<SampleRow<Samples, Byte, oneOfTwo>, Planes> plane;
 
     PYXCC_INLINE auto load(int x) const
     {

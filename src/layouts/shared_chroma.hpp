@@ -176,14 +176,17 @@ template <class Chroma, class Byte> struct SharedChromaImage {
     /// Rows 2 j and 2 j + 1 of luma and row j of chroma.
     PYXCC_INLINE auto rowPair(int j) const
     {
-        return SharedChromaRow{RowPair{luma(2 * j), luma(2 * j + 1)}, chroma.row(j)};
+        return SharedChromaRow{RowPair{luma<true>(2 * j), luma<true>(2 * j + 1)}, chroma.row(j)};
     }
 
     /// The same pair where it has no second row.
     PYXCC_INLINE auto halfPair(int j) const { return SharedChromaRow{luma(2 * j), chroma.row(j)}; }
 
 private:
-    PYXCC_INLINE auto luma(int y) const { return SampleRow<wide::U8, Byte>{rowAt(first, step, y)}; }
+    template <bool oneOfTwo = false> PYXCC_INLINE auto luma(int y) const
+    {
+        return SampleRow<wide::U8, Byte, oneOfTwo>{rowAt(first, step, y)};
+    }
 };
 
 /// Luma and chroma bytes in turn, luma first.
