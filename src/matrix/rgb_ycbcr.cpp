@@ -19,7 +19,7 @@ PyxStatus PYXCC_CALL pyxiRGBToYCbCr_8u_C3R(const u8* src, int srcStep, u8* dst, 
 PyxStatus PYXCC_CALL pyxiRGBToYCbCr_8u_AC4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return eachRow(roi, ac4(src, srcStep), ac4(dst, dstStep), everyPixel(fwdExact));
+    return eachRow(roi, ac4<Order::any>(src, srcStep), ac4<Order::any>(dst, dstStep), everyPixel(fwdExact));
 }
 
 PyxStatus PYXCC_CALL pyxiRGBToYCbCr_8u_C3P3R(const u8* src, int srcStep, u8* const dst[3], int dstStep, RoiSize roi)
@@ -55,7 +55,7 @@ PyxStatus PYXCC_CALL pyxiYCbCrToRGB_8u_C3R(const u8* src, int srcStep, u8* dst, 
 PyxStatus PYXCC_CALL pyxiYCbCrToRGB_8u_AC4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return eachRow(roi, ac4(src, srcStep), ac4(dst, dstStep), everyPixel(invExactA));
+    return eachRow(roi, ac4<Order::any>(src, srcStep), ac4<Order::any>(dst, dstStep), everyPixel(invExactA));
 }
 
 PyxStatus PYXCC_CALL pyxiYCbCrToRGB_8u_P3R(const u8* const src[3], int srcStep, u8* const dst[3], int dstStep,

@@ -199,11 +199,7 @@ PYXCC_INLINE wide::Sample highBytes(wide::U8 x)
 /// first and the third quarter, the second and the fourth.
 PYXCC_INLINE Two<wide::U8> loadForWidening(const u8* p)
 {
-    const auto quarters = [p](int first, int second) PYXCC_INLINE_LAMBDA {
-        const __m256i low = _mm256_castsi128_si256(loadHalf(p + 16 * first).v);
-        return wide::U8(_mm256_inserti128_si256(low, loadHalf(p + 16 * second).v, 1));
-    };
-    return {quarters(0, 2), quarters(1, 3)};
+    return {wide::U8(detail::lanesFrom(p, p + 32)), wide::U8(detail::lanesFrom(p + 16, p + 48))};
 }
 
 namespace detail

@@ -10,12 +10,7 @@ namespace pyxcc::layouts
 /// Reads 64 bytes of samples.
 template <class Register> PYXCC_INLINE Two<Register> loadForNarrowing(const u8* p)
 {
-    const auto halves = [p](int at) PYXCC_INLINE_LAMBDA {
-        const __m128i low = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + at));
-        const __m128i high = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + at + 32));
-        return _mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1);
-    };
-    return {Register(halves(0)), Register(halves(16))};
+    return {Register(detail::lanesFrom(p, p + 32)), Register(detail::lanesFrom(p + 16, p + 48))};
 }
 
 /// Writes 64 bytes of samples.

@@ -85,9 +85,7 @@ template <int PixelBytes> PYXCC_INLINE wide::Pixels<PixelBytes> loadEight(const 
         return wide::Pixels<4>(detail::loadWhole(p));
     } else {
         // The upper half of the register ends where the pixels end.
-        const __m128i low = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p));
-        const __m128i high = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + 8));
-        return wide::Pixels<3>(_mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1));
+        return wide::Pixels<3>(detail::lanesFrom(p, p + 8));
     }
 }
 

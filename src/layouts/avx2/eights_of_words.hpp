@@ -39,12 +39,7 @@ constexpr Places pixelsOfWords(int first, int channel, int channels)
 /// Reads 8 pixels of three unsigned words.
 PYXCC_INLINE Three<wide::S32> loadEightTriplesOfWords(const u8* p)
 {
-    const auto halves = [p](int at) PYXCC_INLINE_LAMBDA {
-        const __m128i low = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + at));
-        const __m128i high = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + at + 24));
-        return _mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1);
-    };
-    const __m256i begin = halves(0), end = halves(8);
+    const __m256i begin = detail::lanesFrom(p, p + 24), end = detail::lanesFrom(p + 8, p + 32);
     const auto channel = [&]<int C>(std::integral_constant<int, C>) PYXCC_INLINE_LAMBDA {
         static constexpr detail::Places first = detail::wordsOfPixels(C, false), last = detail::wordsOfPixels(C, true);
         return wide::S32(_mm256_or_si256(detail::shuffle(begin, first), detail::shuffle(end, last)));

@@ -5,6 +5,7 @@
 #include "lanes/avx2/samples.hpp"
 
 #include <array>
+#include <utility>
 
 namespace pyxcc::layouts
 {
@@ -23,6 +24,15 @@ namespace detail
 
 PYXCC_INLINE __m256i loadWhole(const u8* p) { return _mm256_loadu_si256(reinterpret_cast<const __m256i*>(p)); }
 PYXCC_INLINE void storeWhole(u8* p, __m256i v) { _mm256_storeu_si256(reinterpret_cast<__m256i*>(p), v); }
+PYXCC_INLINE void storeLane(u8* p, __m128i v) { _mm_storeu_si128(reinterpret_cast<__m128i*>(p), v); }
+
+/// 16 bytes from p and as many from q, a lane each.
+PYXCC_INLINE __m256i lanesFrom(const u8* p, const u8* q)
+{
+    const __m128i low = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p));
+    const __m128i high = _mm_loadu_si128(reinterpret_cast<const __m128i*>(q));
+    return _mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1);
+}
 
 template <Stores stores> PYXCC_INLINE void put(u8* p, __m256i v)
 {
@@ -132,6 +142,47 @@ template <int Bytes> PYXCC_INLINE __m256i unpackHigh(__m256i x, __m256i y)
     if constexpr (Bytes == 8) return _mm256_unpackhi_epi64(x, y);
 }
 
+/// Where the bytes of a channel go in a third of 48 bytes; the others are zero.
+template <int Third, int Channel>
+constexpr Places placesInThird = [] {
+    Places places{};
+    for (int i = 0; i < 16; ++i) {
+        const int at = 16 * Third + i;
+        places[i] = static_cast<u8>(at % 3 == Channel ? at / 3 : 0x80);
+    }
+    return places;
+}();
+
+/// Writes the low lanes of N registers one after the other, then the high ones: stores instead of the shuffles that it
+/// takes to write whole registers. This is register `i`.
+template <int N> PYXCC_INLINE void storeLanes(u8* p, int i, __m256i x)
+{
+    storeLane(p + 16 * i, _mm256_castsi256_si128(x));
+    storeLane(p + 16 * (N + i), _mm256_extracti128_si256(x, 1));
+}
+
+/// The same with whole registers, which are what goes past the cache.
+template <Stores stores> PYXCC_INLINE void putThirds(u8* p, __m256i x, __m256i y, __m256i z)
+{
+    put<stores>(p, _mm256_permute2x128_si256(x, y, 0x20));
+    put<stores>(p + 32, _mm256_blend_epi32(z, x, 0xf0));
+    put<stores>(p + 64, _mm256_permute2x128_si256(y, z, 0x31));
+}
+
+/// Four bytes of each channel side by side, of pixels of three that start at byte `Start` of a lane.
+template <int Start>
+constexpr Places foursOfTriples = placesOfBytes<1>([](int i) { return Start + i % 4 * 3 + i / 4; });
+
+/// Four registers with four bytes of each channel in a lane to a register a channel, in which each lane has those of
+/// the first register, then those of the second and so on.
+PYXCC_INLINE Four<wide::U8> channelsOfFours(__m256i x0, __m256i x1, __m256i x2, __m256i x3)
+{
+    const __m256i ab0 = _mm256_unpacklo_epi32(x0, x1), ab1 = _mm256_unpacklo_epi32(x2, x3);
+    const __m256i cd0 = _mm256_unpackhi_epi32(x0, x1), cd1 = _mm256_unpackhi_epi32(x2, x3);
+    return {wide::U8(_mm256_unpacklo_epi64(ab0, ab1)), wide::U8(_mm256_unpackhi_epi64(ab0, ab1)),
+            wide::U8(_mm256_unpacklo_epi64(cd0, cd1)), wide::U8(_mm256_unpackhi_epi64(cd0, cd1))};
+}
+
 } // namespace detail
 
 /// Reads a block of pixels of three samples, 96 bytes.
@@ -151,6 +202,18 @@ template <class Samples> PYXCC_INLINE Three<Samples> loadTriples(const u8* p)
             detail::as<Samples>(Thirds::template gather<2>(Thirds::blend(z, y, x)))};
 }
 
+/// Bytes come four pixels to a lane, as those of four samples do.
+template <class Samples>
+requires(sampleBytes<Samples> == 1) PYXCC_INLINE Three<Samples> loadTriples(const u8* p)
+{
+    // The last four end where the block does.
+    const auto lanes = [p](int at) PYXCC_INLINE_LAMBDA { return detail::lanesFrom(p + at, p + 48 + at); };
+    const Four<wide::U8> pixels = detail::channelsOfFours(
+        detail::shuffle(lanes(0), detail::foursOfTriples<0>), detail::shuffle(lanes(12), detail::foursOfTriples<0>),
+        detail::shuffle(lanes(24), detail::foursOfTriples<0>), detail::shuffle(lanes(32), detail::foursOfTriples<4>));
+    return {detail::as<Samples>(pixels.a.v), detail::as<Samples>(pixels.b.v), detail::as<Samples>(pixels.c.v)};
+}
+
 /// Writes a block of pixels of three samples, 96 bytes.
 template <Stores stores = Stores::cached, class Samples>
 PYXCC_INLINE void storeTriples(u8* p, const Three<Samples>& pixels)
@@ -163,15 +226,35 @@ PYXCC_INLINE void storeTriples(u8* p, const Three<Samples>& pixels)
     const __m256i x = Thirds::blend(a, b, c);
     const __m256i y = afterFirst ? Thirds::blend(b, c, a) : Thirds::blend(c, a, b);
     const __m256i z = afterFirst ? Thirds::blend(c, a, b) : Thirds::blend(b, c, a);
-    detail::put<stores>(p, _mm256_permute2x128_si256(x, y, 0x20));
-    detail::put<stores>(p + 32, _mm256_blend_epi32(z, x, 0xf0));
-    detail::put<stores>(p + 64, _mm256_permute2x128_si256(y, z, 0x31));
+    detail::putThirds<stores>(p, x, y, z);
+}
+
+/// Bytes: each third takes its own of every channel.
+template <Stores stores = Stores::cached, class Samples>
+requires(sampleBytes<Samples> == 1) PYXCC_INLINE void storeTriples(u8* p, const Three<Samples>& pixels)
+{
+    const auto third = [&]<int T>(std::integral_constant<int, T>) PYXCC_INLINE_LAMBDA {
+        const __m256i a = detail::shuffle(detail::raw(pixels.a), detail::placesInThird<T, 0>);
+        const __m256i b = detail::shuffle(detail::raw(pixels.b), detail::placesInThird<T, 1>);
+        const __m256i c = detail::shuffle(detail::raw(pixels.c), detail::placesInThird<T, 2>);
+        return _mm256_or_si256(_mm256_or_si256(a, b), c);
+    };
+    const __m256i x = third(std::integral_constant<int, 0>{});
+    const __m256i y = third(std::integral_constant<int, 1>{});
+    const __m256i z = third(std::integral_constant<int, 2>{});
+    if constexpr (stores == Stores::streamed) {
+        detail::putThirds<stores>(p, x, y, z);
+    } else {
+        detail::storeLanes<3>(p, 0, x);
+        detail::storeLanes<3>(p, 1, y);
+        detail::storeLanes<3>(p, 2, z);
+    }
 }
 
 /// Reads a block of pixels of four samples, 128 bytes.
 template <class Samples, Order order = Order::ofMemory> PYXCC_INLINE Four<Samples> loadQuadruples(const u8* p)
 {
-    // Four bytes of a channel side by side, then eight, then sixteen; the lanes come out interleaved by fours.
+    // The lanes come out interleaved by fours.
     const auto fours = [p](int at) PYXCC_INLINE_LAMBDA {
         constexpr int bytes = sampleBytes<Samples>;
         const __m256i x = detail::loadWhole(p + at);
@@ -183,14 +266,12 @@ template <class Samples, Order order = Order::ofMemory> PYXCC_INLINE Four<Sample
         }
     };
     const __m256i x0 = fours(0), x1 = fours(32), x2 = fours(64), x3 = fours(96);
-    const __m256i ab0 = _mm256_unpacklo_epi32(x0, x1), ab1 = _mm256_unpacklo_epi32(x2, x3);
-    const __m256i cd0 = _mm256_unpackhi_epi32(x0, x1), cd1 = _mm256_unpackhi_epi32(x2, x3);
+    const Four<wide::U8> lanes = detail::channelsOfFours(x0, x1, x2, x3);
     const __m256i inOrder = _mm256_setr_epi32(0, 4, 1, 5, 2, 6, 3, 7);
-    const auto channel = [&](__m256i lanes) PYXCC_INLINE_LAMBDA {
-        return detail::as<Samples>(order == Order::any ? lanes : _mm256_permutevar8x32_epi32(lanes, inOrder));
+    const auto channel = [&](const wide::U8& x) PYXCC_INLINE_LAMBDA {
+        return detail::as<Samples>(order == Order::any ? x.v : _mm256_permutevar8x32_epi32(x.v, inOrder));
     };
-    return {channel(_mm256_unpacklo_epi64(ab0, ab1)), channel(_mm256_unpackhi_epi64(ab0, ab1)),
-            channel(_mm256_unpacklo_epi64(cd0, cd1)), channel(_mm256_unpackhi_epi64(cd0, cd1))};
+    return {channel(lanes.a), channel(lanes.b), channel(lanes.c), channel(lanes.d)};
 }
 
 /// Pixels of four doubles come in the order of memory, which takes no work.
@@ -198,11 +279,7 @@ template <class Samples, Order order = Order::ofMemory>
 requires(sampleBytes<Samples> == 8) PYXCC_INLINE Four<Samples> loadQuadruples(const u8* p)
 {
     // Half a pixel, and the same half of the next but one.
-    const auto halves = [p](int at) PYXCC_INLINE_LAMBDA {
-        const __m128i low = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + at));
-        const __m128i high = _mm_loadu_si128(reinterpret_cast<const __m128i*>(p + at + 64));
-        return _mm256_inserti128_si256(_mm256_castsi128_si256(low), high, 1);
-    };
+    const auto halves = [p](int at) PYXCC_INLINE_LAMBDA { return detail::lanesFrom(p + at, p + at + 64); };
     const __m256i ab0 = halves(0), cd0 = halves(16), ab1 = halves(32), cd1 = halves(48);
     return {detail::as<Samples>(_mm256_unpacklo_epi64(ab0, ab1)), detail::as<Samples>(_mm256_unpackhi_epi64(ab0, ab1)),
             detail::as<Samples>(_mm256_unpacklo_epi64(cd0, cd1)), detail::as<Samples>(_mm256_unpackhi_epi64(cd0, cd1))};
@@ -211,8 +288,8 @@ requires(sampleBytes<Samples> == 8) PYXCC_INLINE Four<Samples> loadQuadruples(co
 namespace detail
 {
 
-/// The four registers of interleaved pixels, in the order of memory.
-template <Order order, class Samples> PYXCC_INLINE Four<wide::U8> interleave(const Four<Samples>& pixels)
+/// The four registers of interleaved pixels, in the order of memory if that of the samples is any.
+template <class Samples> PYXCC_INLINE Four<wide::U8> interleave(const Four<Samples>& pixels)
 {
     constexpr int bytes = sampleBytes<Samples>;
     const __m256i a = raw(pixels.a), b = raw(pixels.b), c = raw(pixels.c), d = raw(pixels.d);
@@ -220,9 +297,18 @@ template <Order order, class Samples> PYXCC_INLINE Four<wide::U8> interleave(con
     const __m256i cd0 = unpackLow<bytes>(c, d), cd1 = unpackHigh<bytes>(c, d);
     const __m256i x0 = unpackLow<2 * bytes>(ab0, cd0), x1 = unpackHigh<2 * bytes>(ab0, cd0);
     const __m256i x2 = unpackLow<2 * bytes>(ab1, cd1), x3 = unpackHigh<2 * bytes>(ab1, cd1);
-    if constexpr (order == Order::any) return {wide::U8(x0), wide::U8(x1), wide::U8(x2), wide::U8(x3)};
-    return {wide::U8(_mm256_permute2x128_si256(x0, x1, 0x20)), wide::U8(_mm256_permute2x128_si256(x2, x3, 0x20)),
-            wide::U8(_mm256_permute2x128_si256(x0, x1, 0x31)), wide::U8(_mm256_permute2x128_si256(x2, x3, 0x31))};
+    return {wide::U8(x0), wide::U8(x1), wide::U8(x2), wide::U8(x3)};
+}
+
+/// The same for samples in either order.
+template <Order order, class Samples> PYXCC_INLINE Four<wide::U8> interleaveInOrder(const Four<Samples>& pixels)
+{
+    const Four<wide::U8> x = interleave(pixels);
+    if constexpr (order == Order::any) return x;
+    return {wide::U8(_mm256_permute2x128_si256(x.a.v, x.b.v, 0x20)),
+            wide::U8(_mm256_permute2x128_si256(x.c.v, x.d.v, 0x20)),
+            wide::U8(_mm256_permute2x128_si256(x.a.v, x.b.v, 0x31)),
+            wide::U8(_mm256_permute2x128_si256(x.c.v, x.d.v, 0x31))};
 }
 
 } // namespace detail
@@ -231,11 +317,19 @@ template <Order order, class Samples> PYXCC_INLINE Four<wide::U8> interleave(con
 template <Order order = Order::ofMemory, Stores stores = Stores::cached, class Samples>
 PYXCC_INLINE void storeQuadruples(u8* p, const Four<Samples>& pixels)
 {
-    const Four<wide::U8> x = detail::interleave<order>(pixels);
-    detail::put<stores>(p, x.a.v);
-    detail::put<stores>(p + 32, x.b.v);
-    detail::put<stores>(p + 64, x.c.v);
-    detail::put<stores>(p + 96, x.d.v);
+    if constexpr (sampleBytes<Samples> == 1 && order == Order::ofMemory && stores == Stores::cached) {
+        const Four<wide::U8> x = detail::interleave(pixels);
+        detail::storeLanes<4>(p, 0, x.a.v);
+        detail::storeLanes<4>(p, 1, x.b.v);
+        detail::storeLanes<4>(p, 2, x.c.v);
+        detail::storeLanes<4>(p, 3, x.d.v);
+    } else {
+        const Four<wide::U8> x = detail::interleaveInOrder<order>(pixels);
+        detail::put<stores>(p, x.a.v);
+        detail::put<stores>(p + 32, x.b.v);
+        detail::put<stores>(p + 64, x.c.v);
+        detail::put<stores>(p + 96, x.d.v);
+    }
 }
 
 /// Writes 32 bytes of pixels of four samples; each fourth sample is put back as it was.
@@ -257,12 +351,21 @@ template <class Samples> PYXCC_INLINE void storeButFourths(u8* p, Samples sample
 template <Order order = Order::ofMemory, class Samples>
 PYXCC_INLINE void storeTriplesOfQuadruples(u8* p, const Three<Samples>& pixels)
 {
-    const Four<wide::U8> x = detail::interleave<order>(
+    const Four<wide::U8> x = detail::interleaveInOrder<order>(
         Four<Samples>{pixels.a, pixels.b, pixels.c, detail::as<Samples>(_mm256_setzero_si256())});
-    storeButFourths(p, detail::as<Samples>(x.a.v));
-    storeButFourths(p + 32, detail::as<Samples>(x.b.v));
-    storeButFourths(p + 64, detail::as<Samples>(x.c.v));
-    storeButFourths(p + 96, detail::as<Samples>(x.d.v));
+    const auto store = [p](int at, __m256i v) PYXCC_INLINE_LAMBDA {
+        if constexpr (sampleBytes<Samples> == 1) { // less work than a variable blend
+            const __m256i fourth = _mm256_set1_epi32(static_cast<int>(0xff000000u));
+            const __m256i old = _mm256_and_si256(detail::loadWhole(p + at), fourth);
+            detail::storeWhole(p + at, _mm256_or_si256(v, old));
+        } else {
+            storeButFourths(p + at, detail::as<Samples>(v));
+        }
+    };
+    store(0, x.a.v);
+    store(32, x.b.v);
+    store(64, x.c.v);
+    store(96, x.d.v);
 }
 
 /// Samples that stand where loadQuadruples() puts them, brought to the order of memory.
