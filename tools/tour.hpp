@@ -13,8 +13,8 @@ namespace tool
 {
 
 /// Writes index.html and the pictures it shows into a new directory, and tells of its progress. `title` names the
-/// picture.
-void writeTour(const Image& picture, const std::string& title, std::span<const catalog::Export* const> exports,
+/// picture that is given.
+void writeTour(const Image& given, const std::string& title, std::span<const catalog::Export* const> exports,
                const fs::path& directory, std::ostream& progress);
 
 } // namespace tool

@@ -30,7 +30,7 @@ template <class Sample> PYXCC_INLINE Sample sampleAt(const u8* row, std::ptrdiff
 /// the last row.
 template <int Distance, int Lines = 2> PYXCC_INLINE void expectFrom(const u8* p)
 {
-    for (int i = 0; i < Lines; ++i) __builtin_prefetch(p + Distance + 64 * i);
+    for (int i = 0; i < Lines; ++i) __builtin_prefetch(p + Distance + std::ptrdiff_t{64} * i);
 }
 
 /// How far ahead of its loads and of its stores a loop hints that does hardly more than copy.

@@ -276,7 +276,7 @@ template <int Columns> std::uint64_t decide(Signs<Columns>& signs, int count, st
     static_assert(std::endian::native == std::endian::little);
     constexpr std::uint64_t ones = 0x0101010101010101;
     for (int x = 0; x < count; x += 8) {
-        std::uint64_t negative, zero;
+        std::uint64_t negative = 0, zero = 0;
         std::memcpy(&negative, signs.negative + x, 8);
         std::memcpy(&zero, signs.zero + x, 8);
         const std::uint64_t behindNegative = (negative << 8 | last) & zero & ones;
@@ -291,7 +291,8 @@ template <class T, class Count>
 void choose(const u8* __restrict masks, const T* alongRow, const T* alongColumn, T* __restrict chosen, Count count)
 {
     for (int x = 0; x < count; ++x) {
-        const auto mask = static_cast<T>(static_cast<s8>(masks[x]));
+        // A mask grows by its sign.
+        const auto mask = static_cast<T>(static_cast<s8>(masks[x])); // NOLINT(bugprone-signed-char-misuse)
         chosen[x] = detail::where<T>(mask, alongColumn[x], alongRow[x]);
     }
 }

@@ -47,6 +47,7 @@ enum class Green { plain, alongEdges };
 
 /// Converts `count` columns of a row from an even number of columns behind `from` on.
 template <Green green, bool siteFirst, bool redRow, class T>
+// NOLINTNEXTLINE(readability-non-const-parameter): it is written through the row of pixels
 void convertPairs(const RowsAround<T>& rows, u8* target, int count)
 {
     using Samples = pyxcc::wide::RegisterOf<T>;

@@ -30,8 +30,8 @@ template <class T> struct Work {
 
 /// Rows of the caller's workspace that take turns.
 template <class T, int Rows> struct Ring {
-    T* first;
-    std::ptrdiff_t step;
+    T* first = nullptr;
+    std::ptrdiff_t step = 0;
 
     T* row(s32 y) const { return reinterpret_cast<T*>(rowAt(bytes(first), step, (y % Rows + Rows) % Rows)); }
 

@@ -19,6 +19,7 @@ template <class T> class HalvedRow
 {
 public:
     using Samples = wide::RegisterOf<T>;
+    static constexpr int sampleBytes = sizeof(T);
 
     /// Takes `count` columns and those around them.
     void take(const T* row, int count)
@@ -28,13 +29,12 @@ public:
         const u8* const from = layouts::bytes(row - 2);
         int x = 0;
         for (; x <= end - 2 * lanes; x += 2 * lanes) {
-            const u8* const p = from + x * static_cast<int>(sizeof(T));
-
+            const u8* const p = from + std::ptrdiff_t{x} * sampleBytes;
             put(x / 2, p);
         }
         // What is computed along with the last columns reaches beyond them: it finds zeros.
         u8 rest[4 * 32] = {};
-        layouts::copyBytes(rest, from + x * static_cast<int>(sizeof(T)), (end - x) * static_cast<int>(sizeof(T)));
+        layouts::copyBytes(rest, from + std::ptrdiff_t{x} * sampleBytes, (end - x) * sampleBytes);
         put(x / 2, rest);
         put(x / 2 + lanes, rest + 64);
     }
@@ -50,8 +50,7 @@ private:
     void put(int at, const u8* columns)
     {
         using layouts::loadSamples, layouts::storeSamples, layouts::bytes;
-        const auto [even, odd] =
-            layouts::dealt<static_cast<int>(sizeof(T))>(loadSamples(columns), loadSamples(columns + 32));
+        const auto [even, odd] = layouts::dealt<sampleBytes>(loadSamples(columns), loadSamples(columns + 32));
         storeSamples(bytes(half_[0] + at), even);
         storeSamples(bytes(half_[1] + at), odd);
     }

@@ -24,7 +24,7 @@ PYXCC_INLINE Block loadBlock(const u8* row, int x)
     const u8* const p = row + std::ptrdiff_t{x} * 4;
     layouts::expectFrom<4096>(p);
     Block samples;
-    for (int i = 0; i < registers; ++i) samples.part[i] = layouts::loadSamples<wide::F32>(p + 32 * i);
+    for (int i = 0; i < registers; ++i) samples.part[i] = layouts::loadSamples<wide::F32>(p + std::ptrdiff_t{32} * i);
     return samples;
 }
 

@@ -48,16 +48,6 @@ PYXCC_INLINE U16 equal(U16 x, U16 y) { return U16(_mm256_cmpeq_epi16(x.v, y.v));
 PYXCC_INLINE U16 where(U16 mask, U16 yes, U16 no) { return U16(_mm256_blendv_epi8(no.v, yes.v, mask.v)); }
 PYXCC_INLINE U16 exceptWhere(U16 mask, U16 x) { return U16(_mm256_andnot_si256(mask.v, x.v)); }
 
-/// A mask of every other lane, from the first or the second one on.
-template <class Samples> PYXCC_INLINE Samples everyOther(bool first)
-{
-    if constexpr (Samples::count == 32) {
-        return Samples(U16(first ? 0x00ff : 0xff00).v);
-    } else {
-        return Samples(S32(first ? 0x0000ffff : -65536).v);
-    }
-}
-
 /// Entries of a table; an index is below 16.
 PYXCC_INLINE U8 lookUp(const std::array<u8, 16>& table, U8 index)
 {

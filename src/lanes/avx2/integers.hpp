@@ -12,6 +12,7 @@ namespace pyxcc::wide
 
 /// A register of integers. Its copies are spelled out for the compiler's sake: groups of registers are then copied one
 /// by one and stay in registers, while a group that can be copied as bytes goes through memory.
+// NOLINTBEGIN(cppcoreguidelines-special-member-functions, modernize-use-equals-default)
 struct Integers {
     __m256i v;
 
@@ -24,6 +25,7 @@ struct Integers {
         return *this;
     }
 };
+// NOLINTEND(cppcoreguidelines-special-member-functions, modernize-use-equals-default)
 
 /// 32 samples of 8 bits, as they lie in memory.
 struct U8 : Integers {

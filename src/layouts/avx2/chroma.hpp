@@ -35,11 +35,6 @@ template <int Columns> PYXCC_INLINE wide::Sample loadForPairs(const u8* p)
     return widen(HalfBlock{_mm_unpacklo_epi8(samples, samples)});
 }
 
-PYXCC_INLINE HalfBlock narrowHalf(wide::Byte x)
-{
-    return {_mm_packus_epi16(_mm256_castsi256_si128(x.v), _mm256_extracti128_si256(x.v, 1))};
-}
-
 namespace detail
 {
 

@@ -108,7 +108,7 @@ constexpr std::array<u8, 32> upperBytes = [] {
 /// The channels of 16 pixels as words.
 template <int PixelBytes> PYXCC_INLINE Three<wide::Sample> loadSixteen(const u8* p)
 {
-    const __m256i x = loadEight<PixelBytes>(p).v, y = loadEight<PixelBytes>(p + 8 * PixelBytes).v;
+    const __m256i x = loadEight<PixelBytes>(p).v, y = loadEight<PixelBytes>(p + std::ptrdiff_t{8} * PixelBytes).v;
     const auto words = [](__m256i eight, const std::array<u8, 32>& places)
                            PYXCC_INLINE_LAMBDA { return _mm256_shuffle_epi8(eight, loadWhole(places.data())); };
     const auto sample = [](__m256i in256ths) PYXCC_INLINE_LAMBDA {
@@ -126,7 +126,7 @@ template <int PixelBytes> PYXCC_INLINE Three<wide::Sample> loadSixteen(const u8*
 /// stand where loadQuadruples() puts them.
 template <int PixelBytes> PYXCC_INLINE Two<Three<wide::Sample>> loadAsWords(const u8* p)
 {
-    return {detail::loadSixteen<PixelBytes>(p), detail::loadSixteen<PixelBytes>(p + 16 * PixelBytes)};
+    return {detail::loadSixteen<PixelBytes>(p), detail::loadSixteen<PixelBytes>(p + std::ptrdiff_t{16} * PixelBytes)};
 }
 
 /// Writes 8 pixels of three bytes, saturated.

@@ -75,7 +75,7 @@ PYXCC_INLINE __m256i shuffle(__m256i x, const Places& places) { return _mm256_sh
 // three, and a shuffle brings the samples into order.
 template <int Bytes> struct Thirds {
     static constexpr int samples = 16 / Bytes;
-    static constexpr int inverseOf3 = samples == 16 ? 11 : 3; // modulo `samples`
+    static constexpr int inverseOf3 = 3; // modulo `samples`
 
     /// Place 3 i + c to place i.
     template <int C> static PYXCC_INLINE __m256i gather(__m256i x)
@@ -88,15 +88,6 @@ template <int Bytes> struct Thirds {
         return rearrange([](int i) { return inverseOf3 * (i - C + samples) % samples; }, x);
     }
 
-    /// The bytes of the samples at `start` and every third place behind it.
-    static constexpr Places mask(int start)
-    {
-        Places places{};
-        for (int i = 0; i < 16; ++i) places[i] = i / Bytes % 3 == start ? 0xff : 0;
-        return places;
-    }
-    static constexpr Places second = mask(1), last = mask(2);
-
     /// In each lane, the samples whose place modulo 3 is 0 from x, 1 from y and 2 from z.
     static PYXCC_INLINE __m256i blend(__m256i x, __m256i y, __m256i z)
     {
@@ -104,10 +95,9 @@ template <int Bytes> struct Thirds {
             return _mm256_blend_epi32(x, y, 0xcc);
         } else if constexpr (Bytes == 4) {
             return _mm256_blend_epi32(_mm256_blend_epi32(x, y, 0x22), z, 0x44);
-        } else if constexpr (Bytes == 2) {
-            return _mm256_blend_epi16(_mm256_blend_epi16(x, y, 0x92), z, 0x24);
         } else {
-            return _mm256_blendv_epi8(_mm256_blendv_epi8(x, y, inBothLanes(second)), z, inBothLanes(last));
+            static_assert(Bytes == 2);
+            return _mm256_blend_epi16(_mm256_blend_epi16(x, y, 0x92), z, 0x24);
         }
     }
 
@@ -125,6 +115,18 @@ private:
         }
     }
 };
+
+/// Pixels of three units in their lanes: the first lanes of a, b and c make three, and so do the second ones.
+template <int Bytes> PYXCC_INLINE Three<wide::U8> triplesInLanes(__m256i a, __m256i b, __m256i c)
+{
+    using Thirds = detail::Thirds<Bytes>;
+    a = Thirds::template spread<0>(a);
+    b = Thirds::template spread<1>(b);
+    c = Thirds::template spread<2>(c);
+    constexpr bool afterFirst = Thirds::samples % 3 == 1;
+    const wide::U8 y(Thirds::blend(b, c, a)), z(Thirds::blend(c, a, b));
+    return {wide::U8(Thirds::blend(a, b, c)), afterFirst ? y : z, afterFirst ? z : y};
+}
 
 /// Low or high halves of the 128-bit lanes, interleaved by elements of `Bytes`.
 template <int Bytes> PYXCC_INLINE __m256i unpackLow(__m256i x, __m256i y)
@@ -157,8 +159,8 @@ constexpr Places placesInThird = [] {
 /// takes to write whole registers. This is register `i`.
 template <int N> PYXCC_INLINE void storeLanes(u8* p, int i, __m256i x)
 {
-    storeLane(p + 16 * i, _mm256_castsi256_si128(x));
-    storeLane(p + 16 * (N + i), _mm256_extracti128_si256(x, 1));
+    storeLane(p + std::ptrdiff_t{16} * i, _mm256_castsi256_si128(x));
+    storeLane(p + std::ptrdiff_t{16} * (N + i), _mm256_extracti128_si256(x, 1));
 }
 
 /// The same with whole registers, which are what goes past the cache.
@@ -218,15 +220,9 @@ requires(sampleBytes<Samples> == 1) PYXCC_INLINE Three<Samples> loadTriples(cons
 template <Stores stores = Stores::cached, class Samples>
 PYXCC_INLINE void storeTriples(u8* p, const Three<Samples>& pixels)
 {
-    using Thirds = detail::Thirds<sampleBytes<Samples>>;
-    const __m256i a = Thirds::template spread<0>(detail::raw(pixels.a));
-    const __m256i b = Thirds::template spread<1>(detail::raw(pixels.b));
-    const __m256i c = Thirds::template spread<2>(detail::raw(pixels.c));
-    constexpr bool afterFirst = Thirds::samples % 3 == 1;
-    const __m256i x = Thirds::blend(a, b, c);
-    const __m256i y = afterFirst ? Thirds::blend(b, c, a) : Thirds::blend(c, a, b);
-    const __m256i z = afterFirst ? Thirds::blend(c, a, b) : Thirds::blend(b, c, a);
-    detail::putThirds<stores>(p, x, y, z);
+    const auto [x, y, z] = detail::triplesInLanes<sampleBytes<Samples>>(detail::raw(pixels.a), detail::raw(pixels.b),
+                                                                        detail::raw(pixels.c));
+    detail::putThirds<stores>(p, x.v, y.v, z.v);
 }
 
 /// Bytes: each third takes its own of every channel.

@@ -6,23 +6,6 @@
 namespace pyxcc::layouts
 {
 
-namespace detail
-{
-
-/// Pixels of three units in their lanes: the first lanes of a, b and c make three, and so do the second ones.
-template <int Bytes> PYXCC_INLINE Three<wide::U8> triplesInLanes(__m256i a, __m256i b, __m256i c)
-{
-    using Thirds = detail::Thirds<Bytes>;
-    a = Thirds::template spread<0>(a);
-    b = Thirds::template spread<1>(b);
-    c = Thirds::template spread<2>(c);
-    constexpr bool afterFirst = Thirds::samples % 3 == 1;
-    const wide::U8 y(Thirds::blend(b, c, a)), z(Thirds::blend(c, a, b));
-    return {wide::U8(Thirds::blend(a, b, c)), afterFirst ? y : z, afterFirst ? z : y};
-}
-
-} // namespace detail
-
 /// Three interleaved samples a pixel, the even columns of a block in one register a channel and the odd ones in
 /// another.
 template <class Register> struct PairsOfC3 {
