@@ -2,17 +2,20 @@
 //
 //     pyxcc_bench [--seconds=S] [--benchmark_filter=pyxiRGBToYCbCr_8u_C3R/1920x1080] [...]
 //
-// One thread. An export that reads s bytes and writes t is set against a copy of (s + t) / 2 bytes, which moves as
-// many; its rate counts s + t. The counters are GBps, memcpyGBps (10^9 bytes a second) and share, the one over the
-// other.
+// One thread. Where parameters decide the work there are variants as well, named by what departs from the standard, as
+// in pyxiReduceBits_8u_C1R/noise=20,ditherType=1/640x64. An export that reads s bytes and writes t is set against a
+// copy of (s + t) / 2 bytes, which moves as many; its rate counts s + t. The counters are GBps, memcpyGBps (10^9 bytes
+// a second) and share, the one over the other.
 #include "alternate.hpp"
 #include "workload.hpp"
 
 #include <benchmark/benchmark.h>
 
 #include <algorithm>
+#include <cmath>
 #include <cstdlib>
 #include <cstring>
+#include <span>
 #include <string>
 #include <string_view>
 
@@ -22,9 +25,10 @@ namespace
 /// The first one lies in the processor's cache, the last one does not.
 constexpr RoiSize sizes[] = {{640, 64}, {1920, 1080}, {3840, 2160}};
 
-void measure(benchmark::State& state, const catalog::Export& entry, RoiSize roi, double seconds)
+void measure(benchmark::State& state, const catalog::Export& entry, const catalog::Variant* variant, RoiSize roi,
+             double seconds)
 {
-    const bench::Workload work = bench::prepare(entry, roi);
+    const bench::Workload work = bench::prepare(entry, variant, roi);
     const std::size_t copied = work.bytes / 2;
     const bench::Buffer from = bench::allocate(copied);
     const bench::Buffer to = bench::allocate(copied);
@@ -53,16 +57,28 @@ void measure(benchmark::State& state, const catalog::Export& entry, RoiSize roi,
     state.SetBytesProcessed(static_cast<std::int64_t>(work.bytes));
 }
 
+void registerOne(const catalog::Export& entry, const catalog::Variant* variant, RoiSize roi, double seconds)
+{
+    std::string name(entry.name);
+    for (int i = 0; variant && i < entry.parameterCount; ++i) {
+        const catalog::Parameter& parameter = entry.traits.parameters[i];
+        if ((*variant)[i] == parameter.standard[0]) continue;
+        name += name.find('=') == name.npos ? '/' : ',';
+        name += std::string(parameter.name) + '=' + std::to_string(std::lround((*variant)[i]));
+    }
+    name += '/' + std::to_string(roi.width) + 'x' + std::to_string(roi.height);
+    benchmark::RegisterBenchmark(name.c_str(), measure, entry, variant, roi, seconds)
+        ->Iterations(1)
+        ->UseManualTime()
+        ->Unit(benchmark::kMicrosecond);
+}
+
 void registerAll(double seconds)
 {
     for (const catalog::Export& entry : catalog::exports()) {
-        for (const RoiSize roi : sizes) {
-            const std::string name =
-                std::string(entry.name) + '/' + std::to_string(roi.width) + 'x' + std::to_string(roi.height);
-            benchmark::RegisterBenchmark(name.c_str(), measure, entry, roi, seconds)
-                ->Iterations(1)
-                ->UseManualTime()
-                ->Unit(benchmark::kMicrosecond);
+        for (const RoiSize roi : sizes) registerOne(entry, nullptr, roi, seconds);
+        for (const catalog::Variant& variant : entry.traits.variants) {
+            for (const RoiSize roi : std::span(sizes).first<2>()) registerOne(entry, &variant, roi, seconds);
         }
     }
 }

@@ -4,6 +4,7 @@
 import argparse
 import json
 import math
+import re
 import statistics
 import sys
 from dataclasses import dataclass, field
@@ -40,7 +41,7 @@ def read(path: Path) -> Report:
     for run in data["benchmarks"]:
         if run["run_type"] != "iteration":
             continue
-        name, size = run["run_name"].split("/")[:2]
+        name, size = re.match(r"(.+)/(\d+x\d+)", run["run_name"]).groups()
         if run.get("error_occurred"):
             report.failures.append(f"{name} at {size}: {run['error_message']}")
         else:

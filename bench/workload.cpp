@@ -79,12 +79,12 @@ template <class T> Buffer listOf(const catalog::Parameter& parameter)
     return list;
 }
 
-void addParameters(Workload& work, const catalog::Export& entry)
+void addParameters(Workload& work, const catalog::Export& entry, const catalog::Variant* variant)
 {
     for (int i = 0; i < entry.parameterCount; ++i) {
         const catalog::Parameter& parameter = entry.traits.parameters[i];
         const catalog::ParameterType& type = entry.parameterTypes[i];
-        work.call.parameters[i].number = parameter.standard[0];
+        work.call.parameters[i].number = variant ? (*variant)[i] : parameter.standard[0];
         if (!type.pointer) continue;
         if (parameter.workspace) {
             const catalog::PlaneShape shape = catalog::workspaceOf(entry, work.call.roi);
@@ -110,7 +110,7 @@ Buffer allocate(std::size_t bytes)
     return buffer;
 }
 
-Workload prepare(const catalog::Export& entry, RoiSize roi)
+Workload prepare(const catalog::Export& entry, const catalog::Variant* variant, RoiSize roi)
 {
     Workload work;
     work.call.roi = roi;
@@ -120,7 +120,7 @@ Workload prepare(const catalog::Export& entry, RoiSize roi)
     } else {
         addSide(work, entry.target, {}, work.call.target.data(), work.call.targetStep.data());
     }
-    addParameters(work, entry);
+    addParameters(work, entry, variant);
     return work;
 }
 

@@ -21,7 +21,7 @@ using Buffer = std::unique_ptr<std::byte[], Free>;
 /// `bytes` bytes, all written to, so that no page is first touched while time is taken.
 Buffer allocate(std::size_t bytes);
 
-/// A call with tight images of its own. Parameters have their standard values.
+/// A call with tight images of its own.
 struct Workload {
     std::vector<Buffer> planes;
     std::vector<Buffer> lists; ///< parameters that are pointers
@@ -30,6 +30,7 @@ struct Workload {
         0; ///< of source and target: all that the layouts hold, a fourth channel that is not read included
 };
 
-Workload prepare(const catalog::Export& entry, RoiSize roi);
+/// Parameters have their standard values, or those of a variant.
+Workload prepare(const catalog::Export& entry, const catalog::Variant* variant, RoiSize roi);
 
 } // namespace bench

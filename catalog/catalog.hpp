@@ -183,6 +183,16 @@ bool byDitherTypeOfBits(const Invocation& call);
 inline constexpr int mostParameters = 5;
 template <class T> using PerParameter = std::array<T, mostParameters>;
 
+/// Numbers of a call that is measured as well as the one with the standard numbers.
+using Variant = PerParameter<double>;
+
+/// Methods of fewer levels: of some noise or none, few levels and many.
+inline constexpr Variant methods[] = {{0, 0, 4}, {0, 0, 100}, {0, 1, 4},  {20, 1, 4},  {0, 2, 4},   {20, 2, 4},
+                                      {0, 3, 4}, {20, 3, 4},  {20, 4, 4}, {0, 4, 100}, {20, 4, 100}};
+
+/// Those of one bit a pixel: in front of a byte's first bit or not.
+inline constexpr Variant methodsOfBits[] = {{3, 0, 0, 0, 127}, {0, 0, 0, 3, 127}, {3, 0, 0, 3, 127}};
+
 /// What the signature tells of a parameter.
 struct ParameterType {
     std::string_view type; ///< the C type of a number: "u8", "f32"
@@ -217,6 +227,7 @@ struct Traits {
     Beyond (*beyond)(double, RoiSize) = nullptr;    ///< rows outside of the region, by the first parameter
     int withinImagesFrom = 1;                       ///< a call of a lesser width or height goes beyond its images
     std::string_view writes = {};                   ///< the target's model, where it is not the one of the name
+    std::span<const Variant> variants = {};         ///< further calls to measure
 };
 
 enum class Arrangement {
