@@ -2,17 +2,12 @@
 #include "pyxcc/gamma.h"
 
 #include "frame/scratch.hpp"
-#include "tone/gamma_forms.hpp"
-#include "tone/gamma_images.hpp"
-
-#include <numeric>
+#include "tone/gamma_word_table.hpp"
 
 using namespace pyxcc::tone;
 
 namespace
 {
-
-constexpr int tableSize = 65536;
 
 struct ByTable {
     const u16* table;
@@ -29,21 +24,19 @@ struct ByTable {
 /// Counted in 32 bits, whatever the layout, so that some images of over 2^31 samples count as small ones.
 bool needsTable(RoiSize roi)
 {
-    return static_cast<s32>(static_cast<u32>(roi.width) * 3u * static_cast<u32>(roi.height)) > tableSize;
+    return static_cast<s32>(static_cast<u32>(roi.width) * 3u * static_cast<u32>(roi.height)) > wordTableSize;
 }
 
 template <class Curve, class Images> PyxStatus gamma(const Images& images)
 {
     if (const PyxStatus failure = images.failure()) return failure;
-    const EachSample<GammaOfWords<Curve>> curve;
     if (!needsTable(images.roi)) {
-        images.through(curve);
+        images.through(EachSample<GammaOfWords<Curve>>{});
         return pyxOk;
     }
-    const auto table = pyxcc::frame::allocate<u16>(tableSize);
+    const auto table = pyxcc::frame::allocate<u16>(wordTableSize);
     if (!table) return pyxErrNoMemory;
-    std::iota(table.get(), table.get() + tableSize, u16{0});
-    curve(InPlane{}, {tableSize, 1}, table.get(), 1, table.get(), 1);
+    fillTable<Curve>(table.get());
     images.through(ByTable{table.get()});
     return pyxOk;
 }

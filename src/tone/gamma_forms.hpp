@@ -8,10 +8,12 @@ namespace pyxcc::tone
 {
 
 /// The curves over doubles from 0 to 1 and beyond: a line of this slope below the threshold, and from there, for NaN
-/// too, what curved() says; curvedOfWords() does for words.
+/// too, what curved() says; curvedOfWords() does for words. It goes as the power of x + offset, less a constant.
 struct ForwardCurve {
     static constexpr f64 threshold = 0.018;
     static constexpr f64 slope = 4.5;
+    static constexpr f64 exponent = 0.45, offset = 0, less = 0.099;
+    static constexpr int firstRun = 1184; ///< of words, behind the 1180 of the line
     template <class F64> static PYXCC_INLINE F64 curved(const F64& x) { return fused(power045(x), 1.099, -0.099); }
     template <class F64> static PYXCC_INLINE F64 curvedOfWords(const F64& x)
     {
@@ -22,6 +24,8 @@ struct ForwardCurve {
 struct InverseCurve {
     static constexpr f64 threshold = 0.0812;
     static constexpr f64 slope = 0.2222222222222222;
+    static constexpr f64 exponent = 2.2222222222222223, offset = 0.099, less = 0;
+    static constexpr int firstRun = 5376; ///< of words, behind the 5322 of the line
     template <class F64> static PYXCC_INLINE F64 curved(const F64& x)
     {
         return power222((x + 0.099) * 0.9099181073703366); // one unit in the last place from 1 / 1.099
@@ -40,17 +44,28 @@ template <const ByteCurve& curve> struct GammaOfBytes : frame::OnSamples {
     }
 };
 
-/// Words, which come as floats. Rounding goes by way of a float: what is near below a half can so get to the next
-/// integer, and one that is met exactly becomes even.
+/// What a word has on the curve, before it is rounded.
+template <class Curve, class F64> PYXCC_INLINE F64 gammaOfWord(const F64& v)
+{
+    const auto x = v * 1.5259021896696422e-5;
+    const auto curved = Curve::curvedOfWords(greater(Curve::threshold, x)) * 65535.0;
+    return whereLess(x, Curve::threshold, v * Curve::slope, curved);
+}
+
+/// Rounding goes by way of a float: what is near below a half can so get to the next integer, and one that is met
+/// exactly becomes even.
+template <class F64> PYXCC_INLINE auto roundedToWord(const F64& y)
+{
+    const auto z = toF32(y + 0.5);
+    const auto t = trunc(z);
+    return whereEqual(z, toF32(t), t & ~1, t);
+}
+
+/// Words, which come as floats.
 template <class Curve> struct GammaOfWords : frame::OnSamples {
     template <class F32> PYXCC_INLINE auto operator()(const F32& samples) const
     {
-        const auto v = toF64(samples);
-        const auto x = v * 1.5259021896696422e-5;
-        const auto curved = Curve::curvedOfWords(greater(Curve::threshold, x)) * 65535.0;
-        const auto z = toF32(whereLess(x, Curve::threshold, v * Curve::slope, curved) + 0.5);
-        const auto t = trunc(z);
-        return whereEqual(z, toF32(t), t & ~1, t);
+        return roundedToWord(gammaOfWord<Curve>(toF64(samples)));
     }
 };
 

@@ -1,7 +1,7 @@
-// 16-bit gamma of every sample against the C library's power.
+// 16-bit gamma of every sample, singly and by the table, against the C library's power.
 #include "layouts/avx2/interleave.hpp"
 #include "rounding_modes.hpp"
-#include "tone/gamma_forms.hpp"
+#include "tone/gamma_word_table.hpp"
 
 #include <gtest/gtest.h>
 
@@ -44,7 +44,7 @@ template <class Direction> void expectAllWords(int mode)
 {
     constexpr int block = wide::U16::count;
     const tone::GammaOfWords<typename Direction::Curve> form;
-    std::vector<u16> found(65536), expected(65536);
+    std::vector<u16> found(65536), table(65536), expected(65536);
     forms::roundingBy(mode, [&] {
         for (int v = 0; v < 65536; ++v) expected[v] = plain<Direction>(v);
         for (int v = 0; v < 65536; ++v) found[v] = static_cast<u16>(v);
@@ -52,8 +52,12 @@ template <class Direction> void expectAllWords(int mode)
             u8* const at = reinterpret_cast<u8*>(&found[v]);
             layouts::storeSamples(at, apply(form, several(layouts::loadSamples<wide::U16>(at))).part[0]);
         }
+        tone::fillTable<typename Direction::Curve>(table.data());
     });
-    for (int v = 0; v < 65536; ++v) ASSERT_EQ(found[v], expected[v]) << "of " << v << " in mode " << mode;
+    for (int v = 0; v < 65536; ++v) {
+        ASSERT_EQ(found[v], expected[v]) << "of " << v << " in mode " << mode;
+        ASSERT_EQ(table[v], expected[v]) << "of " << v << " in mode " << mode << ", by the table";
+    }
 }
 
 TEST(GammaOfWords, ForwardIsThePlainStatement)
