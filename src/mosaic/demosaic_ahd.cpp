@@ -4,6 +4,7 @@
 #include "frame/row_driver.hpp"
 #include "layouts/images.hpp"
 #include "mosaic/ahd_forms.hpp"
+#include "mosaic/ahd_homogeneity.hpp"
 #include "mosaic/extended_mosaic.hpp"
 #include "mosaic/sites.hpp"
 
@@ -24,202 +25,173 @@ template <class T> struct Work {
     T* target;
     int targetStep;
     s32 left, top;
-    T* workspace;
-    std::ptrdiff_t workspaceStep;
 };
 
-/// Rows of the caller's workspace that take turns.
-template <class T, int Rows> struct Ring {
-    T* first = nullptr;
-    std::ptrdiff_t step = 0;
-
-    T* row(s32 y) const { return reinterpret_cast<T*>(rowAt(bytes(first), step, (y % Rows + Rows) % Rows)); }
-
-    /// Those around row `y`, from a column on.
-    ThreeRows<T> around(s32 y, int column) const
-    {
-        return {{row(y - 1) + column, row(y) + column, row(y + 1) + column}};
-    }
+/// A part of the image that is converted by itself. Its first row is a whole number of samples from the target's first.
+struct Block {
+    s32 x, y, width, height;
 };
 
-/// The planes of the two candidates for a block. A row has three columns in front of the block and three behind it.
-template <class T> struct Planes {
-    struct Candidate {
-        Ring<T, 4> red, blue;
-        Ring<T, 5> green;
-    };
-    Candidate alongRow, alongColumn;
-    Ring<u8, 4> score;
+/// Rows that take turns.
+template <class Row, int rows> struct Ring {
+    static_assert((rows & (rows - 1)) == 0);
+    Row row[rows];
 
-    Planes(T* workspace, std::ptrdiff_t step)
-    {
-        int rows = 0;
-        const auto take = [&]<class Sample, int Rows>(Ring<Sample, Rows>& ring) {
-            ring = {reinterpret_cast<Sample*>(rowAt(bytes(workspace), step, rows)), step};
-            rows += Rows;
-        };
-        for (Candidate* candidate : {&alongRow, &alongColumn}) {
-            take(candidate->red);
-            take(candidate->blue);
-            take(candidate->green);
-        }
-        take(score);
-    }
+    Row& operator[](s32 y) { return row[y & (rows - 1)]; }
 };
 
-template <class T> class Block
+/// Takes a stretch of a block's columns from its first row to its last. Every row of a plane is made once, and what is
+/// made of it follows as soon as the rows below it are there: what is at work stays in the nearest cache, however wide
+/// the image is. It is so little that the caller's rows are not needed.
+template <class T> class Stretch
 {
 public:
-    Block(const Work<T>& work, s32 x, s32 y, s32 width, s32 height)
-        : work_(work), planes_(work.workspace, work.workspaceStep), x_(x), y_(y), width_(width), height_(height)
+    /// Three columns in front of those that are converted and three behind them.
+    static constexpr int planeColumns = 256, columns = planeColumns - 6;
+
+    Stretch(const Work<T>& work, const Block& block, s32 x)
+        : work_(work), block_(block), x_(x), width_(std::min(columns, block.x + block.width - x)),
+          count_((width_ + 6 + Samples::count - 1) / Samples::count * Samples::count)
     {
     }
 
-    /// Every row of a plane is made once: green first, then what needs the rows of green above and below it, then what
-    /// needs those of the other colours, and so on. Scores are made two rows at a time, which have their luma and
-    /// chroma in common.
-    void convert() const
+    /// Converts the rows [from, to). `last` is kept for each of them.
+    void convert(s32 from, s32 to, u32* last)
     {
-        const s32 scored = y_ + height_ + 1; // rows of scores end in front of this one
-        s32 green = y_ - 3, target = y_;
-        for (s32 row = y_ - 1; row < scored; row += 2) {
-            const int rows = std::min(2, scored - row);
-            for (; green <= row + rows + 1; ++green) {
-                fillGreen(green);
-                if (green >= y_ - 1) fillColors(green - 1);
-            }
-            fillScores(row, rows);
-            for (; target < row + rows - 1; ++target) emit(target);
+        for (s32 y = from - 5; y < from - 1; ++y) fillMosaic(y);
+        for (s32 y = from - 3; y < to + 3; ++y) {
+            fillMosaic(y + 2);
+            fillGreen(y);
+            if (y < from - 1) continue;
+            fillColors(y - 1);
+            if (y < from) continue;
+            measureCandidate(alongRow_, y - 2);
+            measureCandidate(alongColumn_, y - 2);
+            if (y < from + 1) continue;
+            fillScores(y - 2);
+            if (y < from + 3) continue;
+            emit(y - 3, last[y - 3 - from]);
         }
     }
 
 private:
-    /// Columns that are worked on at a time, so that what a step of the work takes and makes stays near at hand.
-    static constexpr int stretch = 256 / static_cast<int>(sizeof(T));
+    using Samples = pyxcc::wide::RegisterOf<T>;
+    static constexpr int sampleSize = sizeof(T), pixelBytes = 3 * sampleSize;
 
-    /// Calls with each stretch of columns [from, to) of the planes.
-    template <int Length = stretch, class Step> static void eachStretch(int from, int to, const Step& step)
-    {
-        int at = from;
-        for (; at <= to - Length; at += Length) step(at, std::integral_constant<int, Length>{});
-        if (at < to) step(at, to - at);
-    }
+    template <class Number> using PlaneRow = Line<Number, planeColumns>;
 
-    /// Column `column` of the planes is this one of the mosaic.
-    s32 place(int column) const { return x_ - 3 + column; }
-
-    GreenParity greenParity(s32 y, int column) const { return isGreen(siteAt(work_.grid, place(column), y)) ? 0 : 1; }
-
-    void fillGreen(s32 y) const
-    {
-        eachStretch(0, width_ + 6, [&](int column, auto count) {
-            T buffers[5][stretch + 4];
-            const T* rows[5];
-            for (int i = 0; i < 5; ++i) {
-                rows[i] = work_.mosaic.samples(y + i - 2, place(column) - 2, place(column) + count + 2, buffers[i]) + 2;
-            }
-            interpolateGreen<stretch>(rows, planes_.alongRow.green.row(y) + column,
-                                      planes_.alongColumn.green.row(y) + column, count, greenParity(y, column));
-        });
-    }
-
-    void fillColors(s32 y) const
-    {
-        const bool redRow = isOfRedRow(siteAt(work_.grid, x_, y));
-        eachStretch(1, width_ + 5, [&](int column, auto count) {
-            T buffers[3][stretch + 2];
-            ThreeRows<T> mosaic;
-            for (int i = 0; i < 3; ++i) {
-                mosaic.row[i] =
-                    work_.mosaic.samples(y + i - 1, place(column) - 1, place(column) + count + 1, buffers[i]) + 1;
-            }
-            for (const auto* candidate : {&planes_.alongRow, &planes_.alongColumn}) {
-                T* const red = candidate->red.row(y) + column;
-                T* const blue = candidate->blue.row(y) + column;
-                interpolateColors<stretch>(mosaic, candidate->green.around(y, column), redRow ? red : blue,
-                                           redRow ? blue : red, count, greenParity(y, column));
-            }
-        });
-    }
-
-    /// The distances of rows of a candidate from each other and along each of those within.
-    struct Measured {
-        Distances<T, stretch> between[3], beside[2];
-
-        DistancesAround<T, stretch> around(int row) const { return {&beside[row], &between[row], &between[row + 1]}; }
+    struct Candidate {
+        Ring<GreenRow<T, planeColumns>, 4> green;
+        Ring<PlaneRow<T>, 4> red, blue;
+        Ring<LumaChroma<T, planeColumns>, 2> converted;
+        Ring<Distances<T, planeColumns>, 2> below;
     };
 
-    void fillScores(s32 y, int rows) const
-    {
-        eachStretch<stretch - 2>(2, width_ + 4, [&](int column, auto count) {
-            const auto withNeighbors = more<2>(count);
-            Measured alongRow, alongColumn;
-            measureCandidate(planes_.alongRow, y, rows, column - 1, alongRow, withNeighbors);
-            measureCandidate(planes_.alongColumn, y, rows, column - 1, alongColumn, withNeighbors);
-            for (int i = 0; i < rows; ++i) {
-                scoreCandidates(alongRow.around(i), alongColumn.around(i), planes_.score.row(y + i) + column,
-                                withNeighbors);
-            }
-        });
-    }
+    bool isGreenFirst(s32 y) const { return isGreen(siteAt(work_.grid, x_ - 3, y)); }
 
-    template <int By, int Count> static constexpr auto more(std::integral_constant<int, Count>)
-    {
-        return std::integral_constant<int, Count + By>{};
-    }
-    template <int By> static constexpr int more(int count) { return count + By; }
+    void fillMosaic(s32 y) { work_.mosaic.take(y, x_ - 5, x_ + width_ + 5, mosaic_[y].at(-2)); }
 
-    template <class Count>
-    static void measureCandidate(const typename Planes<T>::Candidate& candidate, s32 y, int rows, int column,
-                                 Measured& to, Count count)
+    void fillGreen(s32 y)
     {
-        LumaChroma<stretch> converted[4];
-        for (int i = 0; i < rows + 2; ++i) {
-            const auto from = [y = y + i - 1, column](const auto& ring) { return ring.row(y) + column; };
-            toLumaChroma(from(candidate.red), from(candidate.green), from(candidate.blue), converted[i], count);
+        const T* const rows[] = {mosaic_[y - 2].at(), mosaic_[y - 1].at(), mosaic_[y].at(), mosaic_[y + 1].at(),
+                                 mosaic_[y + 2].at()};
+        if (isGreenFirst(y)) {
+            interpolateGreen<true>(rows, alongRow_.green[y], alongColumn_.green[y], count_);
+        } else {
+            interpolateGreen<false>(rows, alongRow_.green[y], alongColumn_.green[y], count_);
         }
-        for (int i = 0; i < rows + 1; ++i) measure<0>(converted[i], converted[i + 1], to.between[i], count);
-        for (int i = 0; i < rows; ++i) measure<1>(converted[i + 1], converted[i + 1], to.beside[i], count);
     }
 
-    void emit(s32 y) const
+    void fillColors(s32 y)
     {
-        std::uint64_t last = 0;
-        u8* const target = targetRow(y);
-        eachStretch(3, width_ + 3, [&](int column, auto count) {
-            Signs<stretch> signs = {}; // whole eights are decided
-            addScores(planes_.score.around(y, column), signs, count);
-            last = decide(signs, count, last);
-            T chosen[3][stretch];
-            const auto chooseFrom = [&](const auto& alongRow, const auto& alongColumn, T* to) {
-                choose(signs.negative, alongRow.row(y) + column, alongColumn.row(y) + column, to, count);
-            };
-            chooseFrom(planes_.alongRow.red, planes_.alongColumn.red, chosen[0]);
-            chooseFrom(planes_.alongRow.green, planes_.alongColumn.green, chosen[1]);
-            chooseFrom(planes_.alongRow.blue, planes_.alongColumn.blue, chosen[2]);
-            using Samples = pyxcc::wide::RegisterOf<T>;
-            const PlanarRow<Samples, const u8, 3> source{{{{bytes(static_cast<const T*>(chosen[0]))},
-                                                           {bytes(static_cast<const T*>(chosen[1]))},
-                                                           {bytes(static_cast<const T*>(chosen[2]))}}}};
-            const InterleavedRow<C3<Samples>, u8> pixels{target + std::ptrdiff_t{column - 3} * pixelBytes, {}};
-            convertColumns(source, pixels, 0, count, Unchanged{});
-        });
+        const bool redRow = isOfRedRow(siteAt(work_.grid, x_, y));
+        for (Candidate* candidate : {&alongRow_, &alongColumn_}) {
+            T *const red = candidate->red[y].at(), *const blue = candidate->blue[y].at();
+            const GreensAround<T, planeColumns> greens = {candidate->green[y - 1], candidate->green[y],
+                                                          candidate->green[y + 1]};
+            if (isGreenFirst(y)) {
+                interpolateColors<true>(mosaic_[y].at(), greens, redRow ? red : blue, redRow ? blue : red, count_);
+            } else {
+                interpolateColors<false>(mosaic_[y].at(), greens, redRow ? red : blue, redRow ? blue : red, count_);
+            }
+            toLumaChroma(red, candidate->green[y].green.at(), blue, candidate->converted[y], count_);
+        }
+    }
+
+    void measureCandidate(Candidate& candidate, s32 y)
+    {
+        measure(candidate.converted[y], candidate.converted[y + 1], candidate.below[y], count_);
+    }
+
+    void fillScores(s32 y)
+    {
+        Distances<T, planeColumns> besideAlongRow, besideAlongColumn;
+        measureBeside(alongRow_.converted[y], besideAlongRow, count_);
+        measureBeside(alongColumn_.converted[y], besideAlongColumn, count_);
+        scoreCandidates({besideAlongRow, alongRow_.below[y - 1], alongRow_.below[y]},
+                        {besideAlongColumn, alongColumn_.below[y - 1], alongColumn_.below[y]}, scores_[y], count_);
+    }
+
+    /// A row of what is chosen, which is computed as it is loaded.
+    struct ChosenRow {
+        static constexpr int block = Samples::count;
+        ThreeRows<T> scores;
+        pyxcc::Three<const T*> alongRow, alongColumn;
+        u32& last;
+
+        PYXCC_INLINE pyxcc::Three<Samples> load(int x) const { return load(x, block); }
+        PYXCC_INLINE pyxcc::Three<Samples> load(int x, int count) const
+        {
+            const Samples mask = choice<T>(scores, x, count, last);
+            const auto chosen = [mask, x](const T* h, const T* v)
+                                    PYXCC_INLINE_LAMBDA { return where(mask, registerOf(v + x), registerOf(h + x)); };
+            return {chosen(alongRow.a, alongColumn.a), chosen(alongRow.b, alongColumn.b),
+                    chosen(alongRow.c, alongColumn.c)};
+        }
+    };
+
+    void emit(s32 y, u32& last)
+    {
+        const auto planes = [y](Candidate& from) {
+            return pyxcc::Three<const T*>{from.red[y].at(3), from.green[y].green.at(3), from.blue[y].at(3)};
+        };
+        const ChosenRow source = {{scores_[y - 1].at(3), scores_[y].at(3), scores_[y + 1].at(3)},
+                                  planes(alongRow_),
+                                  planes(alongColumn_),
+                                  last};
+        const InterleavedRow<C3<Samples>, u8, Hints::near> target{targetRow(y), {}};
+        convertColumns(source, target, 0, width_, Unchanged{});
     }
 
     /// The first row of a block lies a whole number of samples from the target's first.
     u8* targetRow(s32 y) const
     {
         const std::ptrdiff_t wholeStep = work_.targetStep / sampleSize * sampleSize;
-        return rowAt(rowAt(bytes(work_.target), wholeStep, y_ - work_.top), work_.targetStep, y - y_) +
+        return rowAt(rowAt(bytes(work_.target), wholeStep, block_.y - work_.top), work_.targetStep, y - block_.y) +
                std::ptrdiff_t{x_ - work_.left} * pixelBytes;
     }
 
-    static constexpr int sampleSize = sizeof(T), pixelBytes = 3 * sampleSize;
-
     const Work<T>& work_;
-    Planes<T> planes_;
-    s32 x_, y_, width_, height_;
+    const Block& block_;
+    s32 x_;
+    int width_, count_; ///< as many columns as are computed: whole registers
+    Ring<PlaneRow<T>, 8> mosaic_ = {};
+    Candidate alongRow_ = {}, alongColumn_ = {};
+    Ring<PlaneRow<T>, 4> scores_ = {};
 };
+
+/// A stretch leaves behind what each row ends with, for a band of rows; the next one goes on from there.
+template <class T> void convertBlock(const Work<T>& work, const Block& block)
+{
+    constexpr int band = 1024;
+    const s32 bottom = block.y + block.height;
+    for (s32 y = block.y; y < bottom; y += band) {
+        u32 last[band] = {};
+        for (s32 x = block.x; x < block.x + block.width; x += Stretch<T>::columns) {
+            Stretch<T>(work, block, x).convert(y, std::min(y + band, bottom), last);
+        }
+    }
+}
 
 /// The inside, which no mirrored sample reaches, and strips along the four edges. Strips of a small region go beyond
 /// it. The inside begins at a red sample and has even sizes; a negative size is rounded down.
@@ -243,11 +215,11 @@ template <class T> void convertBlocks(const Work<T>& work, s32 width, s32 height
     insideHeight &= ~1;
 
     const s32 below = y + insideHeight, behind = x + insideWidth;
-    if (insideWidth >= 1 && insideHeight >= 1) Block<T>(work, x, y, insideWidth, insideHeight).convert();
-    if (y > top) Block<T>(work, left, top, width, y - top).convert();
-    if (bottom > below) Block<T>(work, left, below, width, bottom - below).convert();
-    if (x > left && insideHeight >= 1) Block<T>(work, left, y, x - left, insideHeight).convert();
-    if (right > behind && insideHeight >= 1) Block<T>(work, behind, y, right - behind, insideHeight).convert();
+    if (insideWidth >= 1 && insideHeight >= 1) convertBlock(work, {x, y, insideWidth, insideHeight});
+    if (y > top) convertBlock(work, {left, top, width, y - top});
+    if (bottom > below) convertBlock(work, {left, below, width, bottom - below});
+    if (x > left && insideHeight >= 1) convertBlock(work, {left, y, x - left, insideHeight});
+    if (right > behind && insideHeight >= 1) convertBlock(work, {behind, y, right - behind, insideHeight});
 }
 
 /// What is left of a length in front of the mosaic's end.
@@ -257,8 +229,7 @@ s32 lengthWithin(s32 start, s32 length, s32 limit)
 }
 
 template <class T>
-PyxStatus convert(const T* src, RoiRect srcRoi, RoiSize srcSize, int srcStep, T* dst, int dstStep, s32 grid, T* tmp,
-                  int tmpStep)
+PyxStatus convert(const T* src, RoiRect srcRoi, RoiSize srcSize, int srcStep, T* dst, int dstStep, s32 grid)
 {
     const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(srcSize, 5, 5), knownGrid(grid));
     if (failure) return failure;
@@ -267,9 +238,7 @@ PyxStatus convert(const T* src, RoiRect srcRoi, RoiSize srcSize, int srcStep, T*
                           .target = dst,
                           .targetStep = dstStep,
                           .left = std::max(srcRoi.x, 0),
-                          .top = std::max(srcRoi.y, 0),
-                          .workspace = tmp,
-                          .workspaceStep = tmpStep & -static_cast<int>(sizeof(T))};
+                          .top = std::max(srcRoi.y, 0)};
     const s32 width = lengthWithin(work.left, srcRoi.width, srcSize.width);
     const s32 height = lengthWithin(work.top, srcRoi.height, srcSize.height);
     if (width >= 1 && height >= 1) convertBlocks(work, width, height);
@@ -279,13 +248,13 @@ PyxStatus convert(const T* src, RoiRect srcRoi, RoiSize srcSize, int srcStep, T*
 } // namespace
 
 PyxStatus PYXCC_CALL pyxiDemosaicAHD_8u_C1C3R(const u8* src, RoiRect srcRoi, RoiSize srcSize, int srcStep, u8* dst,
-                                              int dstStep, s32 grid, u8* tmp, int tmpStep)
+                                              int dstStep, s32 grid, u8* /*tmp*/, int /*tmpStep*/)
 {
-    return convert(src, srcRoi, srcSize, srcStep, dst, dstStep, grid, tmp, tmpStep);
+    return convert(src, srcRoi, srcSize, srcStep, dst, dstStep, grid);
 }
 
 PyxStatus PYXCC_CALL pyxiDemosaicAHD_16u_C1C3R(const u16* src, RoiRect srcRoi, RoiSize srcSize, int srcStep, u16* dst,
-                                               int dstStep, s32 grid, u16* tmp, int tmpStep)
+                                               int dstStep, s32 grid, u16* /*tmp*/, int /*tmpStep*/)
 {
-    return convert(src, srcRoi, srcSize, srcStep, dst, dstStep, grid, tmp, tmpStep);
+    return convert(src, srcRoi, srcSize, srcStep, dst, dstStep, grid);
 }

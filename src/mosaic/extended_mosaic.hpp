@@ -3,7 +3,7 @@
 
 #include "layouts/bytes.hpp"
 
-#include <cstdint>
+#include <algorithm>
 #include <cstring>
 
 namespace pyxcc::mosaic
@@ -14,23 +14,22 @@ template <class T> struct ExtendedMosaic {
     std::ptrdiff_t step;
     s32 width, height;
 
-    /// The samples of row `y` from column `from` up to `to`: where they lie, if they are all within the mosaic, or a
-    /// copy in `buffer`. What is reflected to beyond the other end of a short row is read from there.
-    const T* samples(s32 y, s32 from, s32 to, T* buffer) const
+    /// Copies the samples of row `y` from column `from` up to `to`. What is reflected to beyond the other end of a
+    /// short row is read from there.
+    void take(s32 y, s32 from, s32 to, T* target) const
     {
+        constexpr int size = sizeof(T);
         const u8* const row = layouts::rowAt(layouts::bytes(first), step, mirrored(y, height - 1));
-        const u8* const at = row + std::ptrdiff_t{from} * static_cast<int>(sizeof(T));
-        const bool whole = from >= 0 && to <= width;
-        if (whole && reinterpret_cast<std::uintptr_t>(at) % sizeof(T) == 0) return reinterpret_cast<const T*>(at);
-        if (whole) {
-            std::memcpy(buffer, at, static_cast<std::size_t>(to - from) * sizeof(T));
-            return buffer;
-        }
+        const s32 inside = std::clamp(0, from, to), behind = std::clamp(width, inside, to);
         for (s32 x = from; x < to; ++x) {
-            const std::ptrdiff_t column = mirrored(x, width - 1);
-            std::memcpy(buffer + (x - from), row + column * static_cast<int>(sizeof(T)), sizeof(T));
+            if (x == inside) {
+                std::memcpy(target + (x - from), row + std::ptrdiff_t{x} * size,
+                            static_cast<std::size_t>(behind - x) * size);
+                x = behind;
+                if (x >= to) break;
+            }
+            std::memcpy(target + (x - from), row + std::ptrdiff_t{mirrored(x, width - 1)} * size, size);
         }
-        return buffer;
     }
 
 private:

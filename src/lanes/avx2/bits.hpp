@@ -17,4 +17,15 @@ PYXCC_INLINE u32 bitsAbove(U8 x, U8 threshold)
     return __builtin_bswap32(~static_cast<u32>(_mm256_movemask_epi8(isNone)));
 }
 
+/// The uppermost bit of each byte, that of the first one lowest, and bytes of all bits or none out of such bits.
+PYXCC_INLINE u32 bitsOf(U8 bytes) { return static_cast<u32>(_mm256_movemask_epi8(bytes.v)); }
+PYXCC_INLINE U8 maskOf(u32 bits)
+{
+    const __m256i eighths = _mm256_setr_epi8(0, 0, 0, 0, 0, 0, 0, 0, 1, 1, 1, 1, 1, 1, 1, 1, 2, 2, 2, 2, 2, 2, 2, 2, 3,
+                                             3, 3, 3, 3, 3, 3, 3);
+    const __m256i ofPlace = _mm256_set1_epi64x(static_cast<long long>(0x8040201008040201));
+    const __m256i around = _mm256_shuffle_epi8(_mm256_set1_epi32(static_cast<int>(bits)), eighths);
+    return U8(_mm256_cmpeq_epi8(_mm256_and_si256(around, ofPlace), ofPlace));
+}
+
 } // namespace pyxcc::wide
