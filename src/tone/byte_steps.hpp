@@ -1,10 +1,13 @@
-// Functions of bytes that go up by even steps, as those of few levels do: the number of a step is a line in 16 bits,
-// rounded down, and a register can look up the value of a step. The line is found from all 256 values of a function,
-// so that nothing is left to chance. A function that has none is to be taken another way.
+// Functions of bytes that go up by even steps, as those of fewer levels do: the number of a step is a line in 16 bits,
+// rounded down, and a register can look up the value of a step, or where there are more than it holds, the value is a
+// line once more. The lines are found from all 256 values of a function, so that nothing is left to chance. A function
+// that has none is to be taken another way.
 #pragma once
 
+#include "lanes/avx2/byte_lines.hpp"
 #include "lanes/lanes.hpp"
 
+#include <algorithm>
 #include <array>
 #include <optional>
 
@@ -26,8 +29,11 @@ struct ByteSteps {
     /// on 255 itself to be met as well as one that should be there and is not.
     explicit ByteSteps(int steps) : slope(static_cast<u16>(((steps << (shift + 9)) / 255 + 1) / 2 + 4)) {}
 
-    /// What is to be added to the line for it to tell a function.
-    std::optional<u16> offsetOf(const ByteFunction& function);
+    /// What is to be added to the line for it to tell a function, wherever that goes up.
+    std::optional<u16> offsetOf(const ByteFunction& function, int place = 0);
+
+    /// Whether there is another line to try.
+    static bool tryNext() { return false; }
 };
 
 /// The value of a function.
@@ -45,6 +51,59 @@ PYXCC_INLINE wide::U8 lookUp(const ByteSteps& steps, wide::U8 x, const Two<wide:
     };
     const Two<wide::Sample> words = widen(x);
     return lookUp(steps.valueOf, narrow(numbers(words.a, offsets.a), numbers(words.b, offsets.b)));
+}
+
+/// Functions of up to 255 steps. A byte times the steps is its number in 255ths, exactly; what is added to it is one
+/// step more, for nothing to be below zero.
+struct FineSteps {
+    static constexpr int most = 255;
+    static constexpr u16 in128ths = 32897; ///< 2^23 / 255: of a product with 255ths the upper word is 128ths
+
+    u16 factor;       ///< 256 times the steps
+    u8 nudge = 0;     ///< in 256ths of a byte, to all but the lowest: what is on a step counts as above it
+    u16 slope;        ///< of values, over 128ths of a step
+    u16 scale;        ///< of what the slope gives to a value
+    u16 excess;       ///< 128ths to take off: the step more, but for where the line of values starts
+    u8 nearTop = 255; ///< the line's value that stands for 255
+
+    /// `valueOf` gives the value of each step, and of one more.
+    template <class ValueOf> FineSteps(int steps, const ValueOf& valueOf)
+    {
+        std::array<u8, most + 2> values;
+        for (int n = 0; n <= steps + 1; ++n) values[n] = valueOf(n);
+        findValues(steps, values);
+    }
+
+    /// What is to be added to the line for it to tell a function, which goes up where a byte is more than about so many
+    /// 255ths above a step.
+    std::optional<u16> offsetOf(const ByteFunction& function, int place) const;
+
+    /// Whether there is another line to try.
+    bool tryNext();
+
+private:
+    void findValues(int steps, const std::array<u8, most + 2>& values);
+};
+
+inline u8 lookUp(const FineSteps& steps, u8 x, u16 offset)
+{
+    const u32 in255ths = ((256u * x + std::min(x, steps.nudge)) * steps.factor >> 16) + offset;
+    const u32 in128ths = (static_cast<u16>(in255ths) * u32{FineSteps::in128ths} >> 16) & 0xff80;
+    const u32 less = in128ths > steps.excess ? in128ths - steps.excess : 0;
+    const u32 value = std::min(((less * steps.slope) >> 16) * steps.scale >> 16, 255u);
+    return static_cast<u8>(value == steps.nearTop ? 255 : value);
+}
+
+PYXCC_INLINE wide::U8 lookUp(const FineSteps& steps, wide::U8 x, const Two<wide::U16>& offsets)
+{
+    const auto values = [&](wide::U16 nudged, wide::U16 offset) PYXCC_INLINE_LAMBDA {
+        const wide::U16 in255ths = mulHighU16(nudged, steps.factor) + offset;
+        const wide::U16 in128ths = mulHighU16(in255ths, FineSteps::in128ths) & wide::U16(0xff80);
+        return wide::Byte(mulHighU16(mulHighU16(subSatU16(in128ths, steps.excess), steps.slope), steps.scale).v);
+    };
+    const Two<wide::U16> words = joined(lesser(x, steps.nudge), x);
+    const wide::U8 value = narrow(values(words.a, offsets.a), values(words.b, offsets.b));
+    return greater(value, equal(value, steps.nearTop));
 }
 
 } // namespace pyxcc::tone

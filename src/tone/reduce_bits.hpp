@@ -10,6 +10,7 @@
 #include "tone/reduce_bits_noise.hpp"
 
 #include <algorithm>
+#include <cmath>
 #include <cstdint>
 #include <optional>
 
@@ -86,33 +87,42 @@ PyxStatus takeSamples(const ReduceBits<Depth>& call, const Source& source, const
 template <class Pixel, class Depth> bool maySeekSteps(const ReduceBits<Depth>& call)
 {
     constexpr std::int64_t many = 16384;
-    return call.levels <= ByteSteps::most && std::int64_t{call.roi.width} * call.roi.height * Pixel::samples >= many;
+    return std::int64_t{call.roi.width} * call.roi.height * Pixel::samples >= many;
 }
 
 /// Integers to bytes.
 template <class Depth>
 inline constexpr bool tellsByNumber = std::is_integral_v<typename Depth::Source> && sizeof(typename Depth::Target) == 1;
 
+/// Whether there are such steps, and if there are all is done.
+template <class Pixel, class Depth, class Steps> bool takeNearestBySteps(const ReduceBits<Depth>& call, Steps steps)
+{
+    const NearestWide<Depth> wide(call.levels);
+    const auto offset = steps.offsetOf(ofEveryByte([&](const auto& p) { return apply(wide, p); }), 127);
+    if (!offset) return false;
+    Pattern<Pixel, u16> offsets;
+    offsets.template set<Pixel>(8, [&](int) { return *offset; });
+    const auto places = [&](int) {
+        return [&](const Several<wide::U8, 1>& x, int) PYXCC_INLINE_LAMBDA {
+            return BytesInPlace{x.part[0], offsets.of, nullptr};
+        };
+    };
+    takeSamples<Pixel>(call, inPlace(layouts::asItLies<1>(call.src, call.srcStep), places),
+                       frame::wideThenTail<8>(SteppedBytes<Steps>{steps}, NearestTail<Depth>(call.levels)));
+    return true;
+}
+
 template <class Pixel, class Depth> PyxStatus takeNearest(const ReduceBits<Depth>& call)
 {
     const NearestWide<Depth> wide(call.levels);
     const NearestTail<Depth> tail(call.levels);
     if constexpr (std::is_same_v<Depth, tone::Depth<u8, u8>>) {
-        ByteSteps steps(call.levels - 1);
-        const auto offset = maySeekSteps<Pixel>(call)
-                                ? steps.offsetOf(ofEveryByte([&](const auto& p) { return apply(wide, p); }))
-                                : std::nullopt;
-        if (offset) {
-            Pattern<Pixel, u16> offsets;
-            offsets.template set<Pixel>(8, [&](int) { return *offset; });
-            const auto places = [&](int) {
-                return [&](const Several<wide::U8, 1>& x, int) PYXCC_INLINE_LAMBDA {
-                    return BytesInPlace{x.part[0], offsets.of, nullptr};
-                };
-            };
-            return takeSamples<Pixel>(call, inPlace(layouts::asItLies<1>(call.src, call.srcStep), places),
-                                      frame::wideThenTail<8>(SteppedBytes{steps}, tail));
-        }
+        const int steps = call.levels - 1;
+        if (maySeekSteps<Pixel>(call) &&
+            (call.levels <= ByteSteps::most
+                 ? takeNearestBySteps<Pixel>(call, ByteSteps(steps))
+                 : takeNearestBySteps<Pixel>(call, FineSteps(steps, [&](int n) { return wide.valueOf(n); }))))
+            return pyxOk;
     }
     const auto source = layouts::asFloats(call.src, call.srcStep);
     if constexpr (tellsByNumber<Depth>) {
@@ -153,19 +163,34 @@ inline constexpr f32 matrix[4][4] = {{0.0f, 8 / 15.0f, 2 / 15.0f, 10 / 15.0f},
                                      {1.0f, 7 / 15.0f, 13 / 15.0f, 5 / 15.0f}};
 
 /// What is added to the line of steps, for each entry of the matrix. Some may be beyond it.
-struct MatrixOffsets {
-    ByteSteps steps;
+template <class Steps> struct MatrixOffsets {
+    Steps steps;
     u16 of[4][4];
 
     /// Whether there are any.
     template <class Depth> bool find(const Levels& levels)
     {
+        ByteFunction functions[4][4];
         for (int y = 0; y < 4; ++y) {
             for (int x = 0; x < 4; ++x) {
                 const wide::F32 threshold = levels.step * matrix[y][x];
-                const auto offset = steps.offsetOf(ofEveryByte([&](const auto& p) {
+                functions[y][x] = ofEveryByte([&](const auto& p) {
                     return apply(OrderedWide<Depth>{levels}, Two{p, Four{threshold, threshold, threshold, threshold}});
-                }));
+                });
+            }
+        }
+        do {
+            if (findAll(functions)) return true;
+        } while (steps.tryNext());
+        return false;
+    }
+
+private:
+    bool findAll(const ByteFunction (&functions)[4][4])
+    {
+        for (int y = 0; y < 4; ++y) {
+            for (int x = 0; x < 4; ++x) {
+                const auto offset = steps.offsetOf(functions[y][x], static_cast<int>(std::lround(255 * matrix[y][x])));
                 if (!offset) return false;
                 of[y][x] = *offset;
             }
@@ -174,10 +199,13 @@ struct MatrixOffsets {
     }
 };
 
-template <class Pixel, class Depth>
-PyxStatus takeBySteps(const ReduceBits<Depth>& call, const Levels& levels, const MatrixOffsets& matrixOffsets,
-                      const Pattern<Pixel, f32> (&thresholds)[4])
+/// Whether there are such steps, and if there are all is done.
+template <class Pixel, class Depth, class Steps>
+bool takeOrderedBySteps(const ReduceBits<Depth>& call, const Levels& levels, Steps steps,
+                        const Pattern<Pixel, f32> (&thresholds)[4])
 {
+    MatrixOffsets<Steps> matrixOffsets{steps, {}};
+    if (!matrixOffsets.template find<Depth>(levels)) return false;
     Pattern<Pixel, u16> offsets[4];
     for (int y = 0; y < 4; ++y) offsets[y].template set<Pixel>(8, [&](int x) { return matrixOffsets.of[y][x & 3]; });
     const auto places = [&](int y) {
@@ -186,9 +214,10 @@ PyxStatus takeBySteps(const ReduceBits<Depth>& call, const Levels& levels, const
             return BytesInPlace{samples.part[0], ofRow.from(x), thresholdsOfRow.from(x)};
         };
     };
-    return takeSamples<Pixel>(
+    takeSamples<Pixel>(
         call, inPlace(layouts::asItLies<1>(call.src, call.srcStep), places),
-        eightPixelsThenTail<Pixel>(SteppedBytes{matrixOffsets.steps}, OrderedTail<Depth>{levels}));
+        eightPixelsThenTail<Pixel>(SteppedBytes<Steps>{matrixOffsets.steps}, OrderedTail<Depth>{levels}));
+    return true;
 }
 
 template <class Pixel, class Depth> PyxStatus takeOrdered(const ReduceBits<Depth>& call)
@@ -199,9 +228,13 @@ template <class Pixel, class Depth> PyxStatus takeOrdered(const ReduceBits<Depth
         for (int y = 0; y < 4; ++y)
             thresholds[y].template set<Pixel>(8, [&](int x) { return levels.step * matrix[y][x & 3]; });
         if constexpr (std::is_same_v<Depth, tone::Depth<u8, u8>>) {
-            MatrixOffsets offsets{ByteSteps(call.levels - 1), {}};
-            if (maySeekSteps<Pixel>(call) && offsets.find<Depth>(levels))
-                return takeBySteps<Pixel>(call, levels, offsets, thresholds);
+            const int steps = call.levels - 1;
+            const auto valueOf = [&](int n) { return valueOfStep<Depth>(n, levels.step); };
+            if (maySeekSteps<Pixel>(call) &&
+                (call.levels <= ByteSteps::most
+                     ? takeOrderedBySteps<Pixel>(call, levels, ByteSteps(steps), thresholds)
+                     : takeOrderedBySteps<Pixel>(call, levels, FineSteps(steps, valueOf), thresholds)))
+                return pyxOk;
         }
         return takeByThresholds<Pixel>(
             call, levels, [&](int y) -> const auto& { return thresholds[y & 3]; });

@@ -18,6 +18,12 @@ template <class Depth> struct Nearest {
 
     explicit Nearest(s32 levels) : s(static_cast<f32>(levels - 1)), iv(1.0f / s), hf(0.5f / s) {}
 
+    /// What level n is stored as in bytes.
+    u8 valueOf(int n) const
+    {
+        return scalar::saturate<u8>(storedValue(scalar::F32(static_cast<f32>(n)) * scalar::F32(iv)));
+    }
+
 protected:
     /// The level below, by its number and its value, and what is left.
     template <class F32> struct Below {
@@ -78,6 +84,12 @@ template <class Depth, class F32> PYXCC_INLINE auto storedValue(const F32& p, co
     } else {
         return stored<Depth, false>(value);
     }
+}
+
+/// What so many steps are stored as in bytes.
+template <class Depth> u8 valueOfStep(int n, f32 step)
+{
+    return scalar::saturate<u8>(stored<Depth, false>(scalar::F32(static_cast<f32>(n)) * scalar::F32(step)));
 }
 
 /// The level below, or the one above it where what is left exceeds the threshold.
@@ -171,20 +183,16 @@ struct FewLevels {
 
     std::array<u8, most> valueOf;
 
-    template <class StoredValue> FewLevels(f32 unit, const StoredValue& storedValue)
+    template <class ValueOf> explicit FewLevels(const ValueOf& valueOfLevel)
     {
-        for (int n = 0; n < most; ++n)
-            valueOf[n] = scalar::saturate<u8>(storedValue(scalar::F32(static_cast<f32>(n)) * scalar::F32(unit)));
+        for (int n = 0; n < most; ++n) valueOf[n] = valueOfLevel(n);
     }
 };
 
 template <class Depth> struct NearestOfFew : Nearest<Depth> {
     FewLevels levels;
 
-    explicit NearestOfFew(s32 count)
-        : Nearest<Depth>(count), levels(this->iv, [this](const auto& v) { return this->storedValue(v); })
-    {
-    }
+    explicit NearestOfFew(s32 count) : Nearest<Depth>(count), levels([this](int n) { return this->valueOf(n); }) {}
 
     /// The number of the level.
     template <class F32> PYXCC_INLINE auto operator()(const F32& p) const
@@ -202,7 +210,7 @@ template <class Depth> struct OrderedOfFew {
     FewLevels few;
 
     explicit OrderedOfFew(const Levels& levels)
-        : levels(levels), few(levels.step, [](const auto& v) { return stored<Depth, false>(v); })
+        : levels(levels), few([&](int n) { return valueOfStep<Depth>(n, levels.step); })
     {
     }
 
@@ -228,8 +236,8 @@ PYXCC_INLINE auto apply(const OrderedOfFew<Depth>& form, const Two<Four<wide::F3
 }
 
 /// Levels of bytes as steps.
-struct SteppedBytes {
-    ByteSteps steps;
+template <class Steps> struct SteppedBytes {
+    Steps steps;
 };
 
 /// Bytes of a row, and where what belongs to their columns is.
@@ -239,7 +247,7 @@ struct BytesInPlace {
     const f32* thresholds;
 };
 
-PYXCC_INLINE auto apply(const SteppedBytes& form, const BytesInPlace& x)
+template <class Steps> PYXCC_INLINE auto apply(const SteppedBytes<Steps>& form, const BytesInPlace& x)
 {
     return several(lookUp(form.steps, x.bytes, layouts::loadWordsInOrderOfBytes(x.offsets)));
 }

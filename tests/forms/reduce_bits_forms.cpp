@@ -160,7 +160,7 @@ TYPED_TEST(ReduceBitsForm, FewLevelsAreAsMany)
 using Bytes = Depth<u8, u8>;
 
 /// A line that is found tells a function of bytes exactly, in registers as well.
-void expectTold(const ByteSteps& steps, u16 offset, const ByteFunction& function)
+template <class Steps> void expectTold(const Steps& steps, u16 offset, const ByteFunction& function)
 {
     std::array<u16, 32> offsets;
     offsets.fill(offset);
@@ -220,6 +220,55 @@ TEST(ByteSteps, RefuseOtherFunctions)
     EXPECT_TRUE(shared.offsetOf(half));
     std::fill(half.begin() + 128, half.end(), u8{254});
     EXPECT_FALSE(shared.offsetOf(half)) << "another value of the same step";
+}
+
+ByteFunction nearestOfEveryByte(s32 count)
+{
+    ByteFunction function;
+    for (int x = 0; x < 256; ++x)
+        function[x] = storedOf<u8>(NearestWide<Bytes>(count)(scalar::F32(static_cast<f32>(x))));
+    return function;
+}
+
+/// Rounding leaves few functions without a line.
+TEST(FineSteps, TellNearlyAllLevelsOfBytes)
+{
+    int told = 0, ofMatrix = 0;
+    for (s32 count = 17; count <= 256; ++count) {
+        SCOPED_TRACE(count);
+        const FineSteps nearest(count - 1, [&](int n) { return NearestWide<Bytes>(count).valueOf(n); });
+        const ByteFunction function = nearestOfEveryByte(count);
+        if (const auto offset = nearest.offsetOf(function, 127)) {
+            ++told;
+            ASSERT_NO_FATAL_FAILURE(expectTold(nearest, *offset, function));
+        }
+
+        const Levels levels = levelsOf<u8>(count);
+        tone::detail::MatrixOffsets<FineSteps> ordered{
+            FineSteps(count - 1, [&](int n) { return valueOfStep<Bytes>(n, levels.step); }), {}};
+        if (!ordered.find<Bytes>(levels)) continue;
+        ++ofMatrix;
+        for (int k = 0; k < 16; ++k) {
+            const scalar::F32 threshold = levels.step * tone::detail::matrix[k / 4][k % 4];
+            ByteFunction ofEntry;
+            for (int x = 0; x < 256; ++x)
+                ofEntry[x] = storedOf<u8>(OrderedWide<Bytes>{levels}(scalar::F32(static_cast<f32>(x)), threshold));
+            ASSERT_NO_FATAL_FAILURE(expectTold(ordered.steps, ordered.of[k / 4][k % 4], ofEntry)) << "entry " << k;
+        }
+    }
+    EXPECT_GE(told, 230);
+    EXPECT_GE(ofMatrix, 225);
+}
+
+/// A level in the wrong place, or of another value, is no step of the line.
+TEST(FineSteps, RefuseOtherFunctions)
+{
+    const FineSteps steps(99, [](int n) { return NearestWide<Bytes>(100).valueOf(n); });
+    ByteFunction function = nearestOfEveryByte(100);
+    ASSERT_TRUE(steps.offsetOf(function, 127));
+    ++function[100];
+    EXPECT_FALSE(steps.offsetOf(function, 127)) << "another value of one byte";
+    EXPECT_FALSE(steps.offsetOf(nearestOfEveryByte(101), 127)) << "more steps";
 }
 
 /// An image of one channel through a diffusion by bands of so many rows.
