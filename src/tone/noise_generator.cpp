@@ -34,15 +34,14 @@ constexpr s32 recordUnits = 56;
 
 constexpr u32 next(u32 x) { return x * 69069 + 1013904243; }
 
-/// One number of 32 bits, of any sign.
+/// One number of 32 bits, of any sign. Whether it borrows nobody can foretell, so that nothing branches on it.
 template <class Number> s32 step(NoiseGenerator<Number>& record)
 {
     const u32 t = record.s1 - record.s2 + record.d;
-    const bool borrows = static_cast<s32>(t) < 0;
-    record.d = borrows ? ~0u : 0;
+    record.d = static_cast<u32>(static_cast<s32>(t) >> 31); // all bits where it borrows
     record.s2 = record.s1;
     record.s1 = record.s0;
-    record.s0 = borrows ? t - 18 : t;
+    record.s0 = t - (record.d & 18);
     record.x = next(record.x);
     return static_cast<s32>(record.s0 + record.x);
 }
@@ -80,14 +79,24 @@ PyxStatus fill(typename Variety<Number>::Stored* array, s32 length, NoiseGenerat
     const auto isLong = [=]() -> PyxStatus { return length >= 1 ? pyxOk : pyxErrSize; };
     if (const PyxStatus failure = firstFailure(notNull(array, record), isLong, isOfVariety(record))) return failure;
     NoiseGenerator<Number> state = *record; // in registers
-    for (s32 i = 0; i < length; ++i) {
-        const f64 number = std::fma(state.scale, static_cast<f64>(step(state)), state.mid);
+    const f64 scale = state.scale, mid = state.mid;
+    const auto stored = [&](s32 number) {
+        const f64 scaled = std::fma(scale, static_cast<f64>(number), mid);
         if constexpr (Variety<Number>::tag == 36) {
-            array[i] = static_cast<u16>(static_cast<s32>(number));
+            return static_cast<u16>(static_cast<s32>(scaled));
         } else {
-            array[i] = static_cast<f32>(number);
+            return static_cast<f32>(scaled);
         }
+    };
+    // The steps are a chain, and what follows is none.
+    constexpr s32 some = 64;
+    s32 i = 0;
+    for (; length - i >= some; i += some) {
+        s32 numbers[some];
+        for (s32& number : numbers) number = step(state);
+        for (s32 j = 0; j < some; ++j) array[i + j] = stored(numbers[j]);
     }
+    for (; i < length; ++i) array[i] = stored(step(state));
     *record = state;
     return pyxOk;
 }

@@ -31,6 +31,8 @@ template <class Number, int Period> struct Recurring {
 
     PYXCC_INLINE const Number* from(int x) const { return of + static_cast<u32>(x) % Period; }
 
+    void repeatFront() { std::copy_n(of, block, of + Period); }
+
     /// `at` gives what belongs to a pixel, of which there are so many.
     template <class Pixel, class At> void set(int pixels, const At& at)
     {
@@ -220,6 +222,47 @@ bool takeOrderedBySteps(const ReduceBits<Depth>& call, const Levels& levels, Ste
     return true;
 }
 
+/// Entries of the matrix with noise, by fours of rows.
+template <class Pixel> class NoisyThresholds
+{
+public:
+    using Row = Recurring<f32, samplesIn<Pixel>(Noise::length)>;
+
+    NoisyThresholds(const Noise& noise, f32 step, int pixels) : noise_(noise), step_(step), pixels_(pixels) {}
+
+    /// From row 0 on, one after the other.
+    const Row& ofRow(int y)
+    {
+        if (y % 4 == 0) make(y);
+        return rows_[y & 3];
+    }
+
+private:
+    void make(int y)
+    {
+        using wide::F32;
+        const auto entries = [](int row) PYXCC_INLINE_LAMBDA { return layouts::loadFoursTwice(matrix[row]); };
+        const Four<F32> entriesOf = {entries(0), entries(1), entries(2), entries(3)};
+        for (int x = 0; x < pixels_; x += F32::count) {
+            const Four<F32> amounts = noise_.load(x, y);
+            const auto store = [&](int row, F32 entry, F32 noise) PYXCC_INLINE_LAMBDA {
+                layouts::storeRepeated<Pixel::samples>(rows_[row].of + samplesIn<Pixel>(x),
+                                                       F32(step_) * (entry + noise));
+            };
+            store(0, entriesOf.a, amounts.a);
+            store(1, entriesOf.b, amounts.b);
+            store(2, entriesOf.c, amounts.c);
+            store(3, entriesOf.d, amounts.d);
+        }
+        for (Row& row : rows_) row.repeatFront();
+    }
+
+    NoiseByColumns noise_;
+    f32 step_;
+    int pixels_;
+    Row rows_[4] = {};
+};
+
 template <class Pixel, class Depth> PyxStatus takeOrdered(const ReduceBits<Depth>& call)
 {
     const Levels levels = levelsOf<typename Depth::Source>(call.levels);
@@ -242,14 +285,9 @@ template <class Pixel, class Depth> PyxStatus takeOrdered(const ReduceBits<Depth
     const f32 amount = static_cast<f32>(call.noise);
     Noise noise;
     if (const PyxStatus failure = noise.make(-amount / 100.0f, amount / 100.0f)) return failure;
-    Recurring<f32, samplesIn<Pixel>(Noise::length)> thresholds;
-    const int pixels = std::min(call.roi.width, Noise::length);
+    NoisyThresholds<Pixel> thresholds(noise, levels.step, std::min(call.roi.width, Noise::length));
     return takeByThresholds<Pixel>(
-        call, levels, [&](int y) -> const auto& {
-            thresholds.template set<Pixel>(
-                pixels, [&](int x) { return levels.step * (matrix[y & 3][x & 3] + noise.at(x, y)); });
-            return thresholds;
-        });
+        call, levels, [&](int y) -> const auto& { return thresholds.ofRow(y); });
 }
 
 template <class Pixel, class Depth> PyxStatus reduce(const ReduceBits<Depth>& call, u32 ditherType)

@@ -27,4 +27,16 @@ void Noise::abandon()
     static_cast<void>(amountGenerator.release());
 }
 
+NoiseByColumns::NoiseByColumns(const Noise& noise)
+{
+    for (int odd = 0; odd < 2; ++odd) {
+        for (int i = 0; i < half + atOnce; ++i)
+            amounts_[2 * half * odd + i] = noise.amounts[(2 * i + odd) % Noise::length];
+    }
+    for (int x = 0; x < Noise::length; ++x) {
+        const int place = noise.offsets[x] + x;
+        placeOf_[x] = (place / 2) % half + 2 * half * (place % 2);
+    }
+}
+
 } // namespace pyxcc::tone

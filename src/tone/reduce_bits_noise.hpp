@@ -2,6 +2,8 @@
 #pragma once
 
 #include "frame/scratch.hpp"
+#include "lanes/rows.hpp"
+#include "layouts/avx2/columns.hpp"
 #include "tone/noise_generator.hpp"
 
 #include <memory>
@@ -34,6 +36,29 @@ struct Noise {
         const u32 column = static_cast<u32>(x), row = static_cast<u32>(y);
         return amounts[(offsets[column % length] + 2 * row + column) % length];
     }
+};
+
+/// The same amounts for rows that are taken in turn. From row to row each column goes on by two amounts: with the even
+/// ones and the odd ones apart, those of a column lie in a row.
+class NoiseByColumns
+{
+public:
+    explicit NoiseByColumns(const Noise& noise);
+
+    /// Those of four rows from `y` on and of eight columns from `x` on, which is below the length of the tables.
+    PYXCC_INLINE Four<wide::F32> load(int x, int y) const
+    {
+        const wide::S32 places = (wide::loadLanes(placeOf_ + x, wide::S32()) + wide::S32(y % half)) & wide::S32(~half);
+        s32 placeOf[wide::S32::count];
+        wide::storeLanes(placeOf, places);
+        return layouts::loadColumns(amounts_, placeOf);
+    }
+
+private:
+    static constexpr int half = Noise::length / 2, atOnce = 4;
+
+    f32 amounts_[3 * half + atOnce]; ///< the even ones, with some from the front behind them, and from 2 * half the odd
+    s32 placeOf_[Noise::length];     ///< in row 0
 };
 
 } // namespace pyxcc::tone

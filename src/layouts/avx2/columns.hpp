@@ -1,0 +1,40 @@
+// Columns that begin anywhere, each where a place says.
+#pragma once
+
+#include "lanes/avx2/floats.hpp"
+
+namespace pyxcc::layouts
+{
+
+/// Four floats from each of eight places on: the first ones, the second ones and so on.
+PYXCC_INLINE Four<wide::F32> loadColumns(const f32* floats, const s32* places)
+{
+    const auto fours = [=](int i) PYXCC_INLINE_LAMBDA {
+        return _mm256_set_m128(_mm_loadu_ps(floats + places[i + 4]), _mm_loadu_ps(floats + places[i]));
+    };
+    const __m256 a = fours(0), b = fours(1), c = fours(2), d = fours(3);
+    const __m256 lowAB = _mm256_unpacklo_ps(a, b), highAB = _mm256_unpackhi_ps(a, b);
+    const __m256 lowCD = _mm256_unpacklo_ps(c, d), highCD = _mm256_unpackhi_ps(c, d);
+    return {wide::F32(_mm256_shuffle_ps(lowAB, lowCD, 0x44)), wide::F32(_mm256_shuffle_ps(lowAB, lowCD, 0xee)),
+            wide::F32(_mm256_shuffle_ps(highAB, highCD, 0x44)), wide::F32(_mm256_shuffle_ps(highAB, highCD, 0xee))};
+}
+
+/// Four floats, and the same again.
+PYXCC_INLINE wide::F32 loadFoursTwice(const f32* floats)
+{
+    return wide::F32(_mm256_broadcast_ps(reinterpret_cast<const __m128*>(floats)));
+}
+
+/// Each of eight floats `times` times.
+template <int times> PYXCC_INLINE void storeRepeated(f32* to, wide::F32 x)
+{
+    for (int i = 0; i < times; ++i) {
+        const auto source = [i](int lane) { return (8 * i + lane) / times; };
+        const __m256i places =
+            _mm256_setr_epi32(source(0), source(1), source(2), source(3), source(4), source(5), source(6), source(7));
+        const __m256 repeated = times == 1 ? x.v : _mm256_permutevar8x32_ps(x.v, places);
+        _mm256_storeu_ps(to + 8 * i, repeated);
+    }
+}
+
+} // namespace pyxcc::layouts
