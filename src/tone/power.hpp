@@ -11,7 +11,6 @@
 
 #include "lanes/inline.hpp"
 
-#include <limits>
 #include <numbers>
 
 namespace pyxcc::tone
@@ -54,10 +53,10 @@ template <class F64> PYXCC_INLINE Coarse<F64> coarse(const F64& x, const CoarseP
     return {toF64(withoutLowBits(timesPowerOf2(exp2 * mantissa, whole), 11)), toF64(toF32(bits) * k.excess)};
 }
 
-/// The result, but x itself where that is infinity or NaN.
-template <class F64> PYXCC_INLINE F64 finiteOr(const F64& x, const F64& result)
+/// The result, which is above half of `less`, but that where what is not finite has made the result anything.
+template <class F64> PYXCC_INLINE F64 finiteOr(const F64& less, const F64& result)
 {
-    return whereLess(x, std::numeric_limits<double>::infinity(), result, x);
+    return greater(result, less * 0.5);
 }
 
 /// (1 + e)^p - 1 for small e, by its first coefficients, plus `more`.
@@ -77,8 +76,8 @@ template <class F64> PYXCC_INLINE F64 power045(const F64& x)
         e, {-0.05, 0.02624999999794327, -0.0179374999968003, 0.013677653413640382, -0.011078969603955506}, near.excess);
     // x^0.45 is the square root by x^(-1/20). The exact root is s + (x - s^2) / 2 s, and 1 / s is near to z^10.
     const F64 s = sqrt(x), rest = fused(-s, s, x), ofRest = z8 * z2 * (z * 0.5);
-    const F64 y = s * z, below = fused(s, z, -y);
-    return finiteOr(x, y + fused(y, c, fused(rest, ofRest, below)));
+    const F64 y = s * z;
+    return finiteOr(y, fused(s, z, fused(y, c, rest * ofRest)));
 }
 
 /// w^2.2222222222222223, whose exponent is 20/9 and 8/9 of 2^-53, for w from 0.16 up, infinity and NaN included.
@@ -88,12 +87,12 @@ template <class F64> PYXCC_INLINE F64 power222(const F64& w)
     const F64 z = near.power, z2 = z * z, z4 = z2 * z2, z9 = z4 * z4 * z;
     // z is near to w^(2/9), and z^9 to w^2 = square + rest.
     const F64 square = w * w, rest = fused(w, w, -square);
-    const F64 e = (square - z9 + rest) / z9;
+    const F64 e = fused(w, w, -z9) / z9;
     const F64 c = correction(
         e, {0.1111111111111111, -0.04938271604912385, 0.031092821215886007, -0.02245606215528491, 0.01746585757377671},
         near.excess);
-    const F64 y = square * z, below = fused(square, z, -y);
-    return finiteOr(w, y + fused(y, c, fused(rest, z, below)));
+    const F64 y = square * z; // w^(2/9) is above 0.66
+    return finiteOr(square, fused(square, z, fused(rest, z, y * c)));
 }
 
 // A word has 16 bits, and its rounding looks at no more than 24: powers that are off by less than 2^-40 give every word
