@@ -42,4 +42,32 @@ template <class Image> struct StreamedImage {
 
 template <class Image> auto streamed(const Image& image) { return StreamedImage<Image>{image}; }
 
+/// A row of planes. Its first column at a multiple of 32 bytes is to be the same in all of them.
+template <class Samples, int Planes> struct StreamedRow<PlanarRow<Samples, u8, Planes>> {
+    static constexpr int block = Samples::count;
+    PlanarRow<Samples, u8, Planes> row;
+
+    int firstAligned() const
+    {
+        constexpr int size = sampleBytes<Samples>;
+        return static_cast<int>(-reinterpret_cast<std::uintptr_t>(row.plane[0].at) % 32) / size;
+    }
+
+    template <class Pixels> PYXCC_INLINE void store(int x, const Pixels& pixels) const
+    {
+        const auto put = [&](int plane, Samples samples) PYXCC_INLINE_LAMBDA {
+            u8* const at = row.plane[plane].at + static_cast<std::ptrdiff_t>(x) * sampleBytes<Samples>;
+            detail::put<Stores::streamed>(at, detail::raw(samples));
+        };
+        put(0, pixels.a);
+        put(1, pixels.b);
+        put(2, pixels.c);
+    }
+
+    template <class Pixels> PYXCC_INLINE void store(int x, int count, const Pixels& pixels) const
+    {
+        row.store(x, count, pixels);
+    }
+};
+
 } // namespace pyxcc::layouts

@@ -59,14 +59,19 @@ PyxStatus twistAC4(const Sample* src, int srcStep, Sample* dst, int dstStep, Roi
 }
 
 template <class Sample>
+PyxStatus twistP3Failure(const Sample* const src[3], int srcStep, const Sample* const dst[3], int dstStep, RoiSize roi,
+                         const f32 twist[3][4])
+{
+    using namespace frame;
+    return firstFailure(notNull(src, dst, twist), elementsNotNull<3>(src), elementsNotNull<3>(dst),
+                        sizeAtLeast(roi, 1, 1), stepsAtLeast1(srcStep, dstStep));
+}
+
+template <class Sample>
 PyxStatus twistP3(const Sample* const src[3], int srcStep, Sample* const dst[3], int dstStep, RoiSize roi,
                   const f32 twist[3][4])
 {
-    using namespace frame;
-    if (const PyxStatus failure =
-            firstFailure(notNull(src, dst, twist), elementsNotNull<3>(src), elementsNotNull<3>(dst),
-                         sizeAtLeast(roi, 1, 1), stepsAtLeast1(srcStep, dstStep)))
-        return failure;
+    if (const PyxStatus failure = twistP3Failure<Sample>(src, srcStep, dst, dstStep, roi, twist)) return failure;
     if constexpr (sizeof(Sample) == 1) {
         if (TwistOfBytes<Sample>::suits(twist))
             return twistRowsByNearest(roi, layouts::p3(src, srcStep), layouts::p3(dst, dstStep),

@@ -21,6 +21,17 @@ bool rowsAligned(const void* first, std::ptrdiff_t step, int to)
 /// Whether an image has so many samples that its target is better left out of the cache: more than 137 KiB of floats.
 bool isLarge(RoiSize roi, int samples) { return std::int64_t{roi.width} * roi.height * samples > 34992; }
 
+/// The same for planes. Several are written at a time, which pays from 16 MiB on only.
+bool isVeryLarge(RoiSize roi, int samples) { return std::int64_t{roi.width} * roi.height * samples > 1 << 22; }
+
+/// Whether the planes' rows have a multiple of 32 bytes in the same column, and where floats begin.
+bool rowsAlignedAlike(const f32* const planes[3], std::ptrdiff_t step)
+{
+    const auto offset = [](const f32* plane) { return reinterpret_cast<std::uintptr_t>(plane) % 32; };
+    return rowsAligned(planes[0], step, 4) && offset(planes[1]) == offset(planes[0]) &&
+           offset(planes[2]) == offset(planes[0]);
+}
+
 /// One row for all of an image without gaps, if such a width can be told.
 RoiSize asOneRow(RoiSize roi)
 {
@@ -62,6 +73,9 @@ PyxStatus PYXCC_CALL pyxiColorTwist_32f_AC4IR(f32* srcDst, int srcDstStep, RoiSi
 PyxStatus PYXCC_CALL pyxiColorTwist_32f_P3R(const f32* const src[3], int srcStep, f32* const dst[3], int dstStep,
                                             RoiSize roi, const f32 twist[3][4])
 {
+    if (const PyxStatus failure = twistP3Failure(src, srcStep, dst, dstStep, roi, twist)) return failure;
+    if (isVeryLarge(roi, 3) && rowsAlignedAlike(dst, dstStep))
+        return eachRowStreamed(roi, p3(src, srcStep), streamed(p3(dst, dstStep)), TwistOf<f32>(twist));
     return twistP3(src, srcStep, dst, dstStep, roi, twist);
 }
 

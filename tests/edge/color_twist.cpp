@@ -108,6 +108,30 @@ TEST(ColorTwist, LastOrdinaryAndFirstStreamedSizeAgree)
     EXPECT_EQ(streamed, ordinary);
 }
 
+TEST(ColorTwist, LargePlanesAreThoseOfTheirRows)
+{
+    // 1401 x 1000 pixels are 4203000 samples, where planes go past the cache. They may begin anywhere, alike or not.
+    constexpr int width = 1401, height = 1000, step = 4 * 1408;
+    constexpr std::size_t samples = std::size_t{1408} * height + 16;
+    const std::array<std::vector<f32>, 3> source = {counted<f32>(samples), counted<f32>(samples + 5),
+                                                    counted<f32>(samples + 9)};
+    const f32* const from[] = {source[0].data(), source[1].data() + 5, source[2].data() + 9};
+    for (const auto& [first, third] : {std::pair{0, 0}, {3, 3}, {3, 4}}) {
+        std::array<std::vector<f32>, 3> whole, byRows;
+        whole.fill(std::vector<f32>(samples, -7)), byRows = whole;
+        f32* const to[] = {whole[0].data() + first, whole[1].data() + first, whole[2].data() + third};
+        f32* const rows[] = {byRows[0].data() + first, byRows[1].data() + first, byRows[2].data() + third};
+        ASSERT_EQ(pyxiColorTwist_32f_P3R(from, step, to, step, {width, height}, mixing), pyxOk);
+        for (int y = 0; y < height; ++y) {
+            const std::ptrdiff_t at = std::ptrdiff_t{y} * step / 4;
+            const f32* const fromRow[] = {from[0] + at, from[1] + at, from[2] + at};
+            f32* const toRow[] = {rows[0] + at, rows[1] + at, rows[2] + at};
+            ASSERT_EQ(pyxiColorTwist_32f_P3R(fromRow, step, toRow, step, {width, 1}, mixing), pyxOk);
+        }
+        EXPECT_TRUE(whole == byRows) << first << ", " << third;
+    }
+}
+
 TEST(ColorTwist, FourthSampleStays)
 {
     constexpr f32 white[3][4] = {{0, 0, 0, 255}, {0, 0, 0, 255}, {0, 0, 0, 255}};
