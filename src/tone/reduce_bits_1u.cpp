@@ -20,24 +20,29 @@ namespace
 
 constexpr int block = 32;
 
-/// Blocks begin where a byte of the target does.
+/// Blocks begin where a byte of the target does. What a long row has in front of the first one and behind the last comes
+/// out of blocks as well, which begin and end where the row does, and bits that are set already are set once more.
 void takeByThreshold(const u8* source, const BitRow& target, int width, u8 threshold)
 {
     const SampleRow<wide::U8, const u8> samples{source};
     const wide::U8 limit(threshold);
-    int x = 0;
-    const auto takePart = [&](int count) {
-        target.store(x, count, bitsAbove(samples.load(x, count), limit));
-        x += count;
-    };
-    if (target.offset != 0) takePart(std::min(target.pixelsInFrontOfByte(), width));
-    const auto take = [&](int at) PYXCC_INLINE_LAMBDA { target.store(at, bitsAbove(samples.load(at), limit)); };
+    const auto bitsFrom = [&](int x) PYXCC_INLINE_LAMBDA { return bitsAbove(samples.load(x), limit); };
+    const auto take = [&](int x) PYXCC_INLINE_LAMBDA { target.store(x, bitsFrom(x)); };
+    int x = std::min(target.pixelsInFrontOfByte(), width);
+    if (width < x + block) {
+        target.store(0, x, bitsAbove(samples.load(0, x), limit));
+        target.store(x, width - x, bitsAbove(samples.load(x, width - x), limit));
+        return;
+    }
+    target.store(0, x, bitsFrom(0));
     for (; x <= width - 4 * block; x += 4 * block) {
         expectFrom<expectedLoads>(source + x);
         for (int i = 0; i < 4; ++i) take(x + i * block);
     }
     for (; x <= width - block; x += block) take(x);
-    if (x < width) takePart(width - x);
+    const int bits = (width - x) % 8;
+    if (x < width - bits) take(width - bits - block);
+    if (bits > 0) target.store(width - bits, bits, bitsFrom(width - block) << (block - bits));
 }
 
 /// Errors are eighths of a sample's unit, spread by 42nds. A set bit pays 2047 of them, where white gains 2040. All
