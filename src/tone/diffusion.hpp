@@ -53,14 +53,10 @@ template <class Lane> inline constexpr int lanesOf = 1;
 template <> inline constexpr int lanesOf<wide::F32> = wide::F32::count;
 template <> inline constexpr int lanesOf<wide::S32> = wide::S32::count;
 
-/// Samples of a band on their way to lanes and back, for some steps: a step is a column of the first row, and one
-/// further to the left of each row below.
-template <class Number, int Lanes, int Lag> struct Stage {
+/// Work on a band goes by some steps: a step is a column of the first row, and one further to the left of each row
+/// below.
+template <int Lag> struct Steps {
     static constexpr int steps = 64;
-
-    Number samples[steps][Lanes] = {};
-    Number thresholds[steps][Lanes] = {};
-    s32 results[steps][Lanes];
 
     /// Calls `visit` with the row, its first and its last but one column and the step of the first one, for the steps
     /// from `first` on.
@@ -72,11 +68,20 @@ template <class Number, int Lanes, int Lag> struct Stage {
             if (from < to) visit(r, from - behind, to - behind, from - first);
         }
     }
+};
+
+/// Samples of a band on their way to lanes and back.
+template <class Number, int Lanes, int Lag> struct Stage : Steps<Lag> {
+    using Steps<Lag>::steps;
+
+    Number samples[steps][Lanes] = {};
+    Number thresholds[steps][Lanes] = {};
+    s32 results[steps][Lanes];
 
     /// `sampleAt(row, x)` is the number of a pixel, in bytes from the row's start on.
     template <class SampleAt> void fetch(const Band& band, int first, const SampleAt& sampleAt)
     {
-        eachRow(band, first, [&](int r, int from, int to, int step) {
+        this->eachRow(band, first, [&](int r, int from, int to, int step) {
             const u8* const row = band.source + band.sourceStep * r;
             for (int x = from; x < to; ++x, ++step) samples[step][r] = sampleAt(row, x);
         });
@@ -138,29 +143,42 @@ void diffuseBand(const Band& band, const Kernel& kernel, ErrorRows<Number, Rows>
     };
     for (int t = -2 * reach; t < 0; ++t) advance(t, Lane(0));
 
-    Stage<Number, lanes, lag> stage;
+    typename Kernel::template StageOf<lanes> stage;
     Lane error(0);
+    const auto take = [&](int i, int t) PYXCC_INLINE_LAMBDA {
+        advance(t, error);
+        return kernel.take(stage, i, around.errors);
+    };
+    // What the rows below the last ones are to find.
+    const auto keep = [&](int t) PYXCC_INLINE_LAMBDA {
+        Number errors[lanes];
+        storeLanes(errors, error);
+        const auto keepRow = [&](Number* to, int r) PYXCC_INLINE_LAMBDA {
+            const int x = t - lag * r;
+            if (x >= 0 && x < band.width) to[x] = errors[r];
+        };
+        keepRow(newAbove, band.rows - 1);
+        if (Rows == 3 && band.rows > 1) keepRow(twoAbove, band.rows - 2);
+    };
     const int end = band.width + lag * (band.rows - 1);
     for (int first = 0; first < end; first += stage.steps) {
         kernel.fetch(stage, band, first);
+        // Between the steps at both ends every lane has a column.
         const int steps = std::min(stage.steps, end - first);
-        for (int i = 0; i < steps; ++i) {
-            const int t = first + i;
-            advance(t, error);
-            const auto done =
-                kernel(loadLanes(stage.samples[i], Lane()), loadLanes(stage.thresholds[i], Lane()), around.errors);
-            storeLanes(stage.results[i], done.result);
-            error = zeroOutside(done.error, t, lag, band.width);
-
-            Number errors[lanes];
-            storeLanes(errors, error);
-            const auto keep = [&](Number* to, int r) {
-                const int x = t - lag * r;
-                if (x >= 0 && x < band.width) to[x] = errors[r];
-            };
-            keep(newAbove, band.rows - 1);
-            if (Rows == 3 && band.rows > 1) keep(twoAbove, band.rows - 2);
+        const int full = std::clamp(lag * (lanes - 1) - first, 0, steps);
+        const int fullTo = std::clamp(band.width - first, full, steps);
+        const auto takeEnds = [&](int from, int to) {
+            for (int i = from; i < to; ++i) {
+                error = zeroOutside(take(i, first + i), first + i, lag, band.width);
+                keep(first + i);
+            }
+        };
+        takeEnds(0, full);
+        for (int i = full; i < fullTo; ++i) {
+            error = take(i, first + i);
+            keep(first + i);
         }
+        takeEnds(fullTo, steps);
         kernel.put(stage, band, first);
     }
     if (rotates) std::rotate(row.begin(), row.end() - 1, row.end());
@@ -169,6 +187,7 @@ void diffuseBand(const Band& band, const Kernel& kernel, ErrorRows<Number, Rows>
 /// Samples of a depth become levels.
 template <class Depth, class Neighbours> struct LevelDiffusion {
     static constexpr int reach = Neighbours::reach;
+    template <int Lanes> using StageOf = Stage<f32, Lanes, reach + 1>;
 
     Levels levels;
     const Noise* noise; ///< or null
@@ -195,6 +214,14 @@ template <class Depth, class Neighbours> struct LevelDiffusion {
         const auto integer = stored<Depth, Neighbours::rounded>(to.level);
         return Diffused<F32, std::remove_const_t<decltype(integer)>>{
             to.error, std::is_same_v<typename Depth::Target, s16> ? integer - 32768 : integer};
+    }
+
+    /// One step. Returns what it leaves.
+    template <class Stage, class F32> PYXCC_INLINE F32 take(Stage& stage, int i, const Errors<F32>& errors) const
+    {
+        const auto done = (*this)(loadLanes(stage.samples[i], F32()), loadLanes(stage.thresholds[i], F32()), errors);
+        storeLanes(stage.results[i], done.result);
+        return done.error;
     }
 
     template <class Stage> void put(const Stage& stage, const Band& band, int first) const

@@ -4,12 +4,12 @@
 #include "frame/checks.hpp"
 #include "frame/number_checks.hpp"
 #include "lanes/avx2/bits.hpp"
+#include "layouts/avx2/columns.hpp"
 #include "layouts/bit_rows.hpp"
 #include "layouts/rows.hpp"
 #include "tone/diffusion.hpp"
 
 #include <algorithm>
-#include <iterator>
 
 using namespace pyxcc;
 using namespace pyxcc::frame;
@@ -20,8 +20,9 @@ namespace
 
 constexpr int block = 32;
 
-/// Blocks begin where a byte of the target does. What a long row has in front of the first one and behind the last comes
-/// out of blocks as well, which begin and end where the row does, and bits that are set already are set once more.
+/// Blocks begin where a byte of the target does. What a long row has in front of the first one and behind the last
+/// comes out of blocks as well, which begin and end where the row does, and bits that are set already are set once
+/// more.
 void takeByThreshold(const u8* source, const BitRow& target, int width, u8 threshold)
 {
     const SampleRow<wide::U8, const u8> samples{source};
@@ -45,47 +46,75 @@ void takeByThreshold(const u8* source, const BitRow& target, int width, u8 thres
     if (bits > 0) target.store(width - bits, bits, bitsFrom(width - block) << (block - bits));
 }
 
+/// Samples of a band, and a byte for each step with a bit for each row. Those of the steps before stay for a while, for
+/// rows to be written where blocks of the target end.
+template <int Lanes, int Lag> struct BitStage : tone::detail::Steps<Lag> {
+    using tone::detail::Steps<Lag>::steps;
+
+    u8 samples[steps][Lanes] = {};
+    u8 results[block + steps + block] = {}; ///< from those of the last steps before on
+};
+
 /// Errors are eighths of a sample's unit, spread by 42nds. A set bit pays 2047 of them, where white gains 2040. All
 /// sums wrap.
 struct BitDiffusion {
     static constexpr int reach = 2;
+    template <int Lanes> using StageOf = BitStage<Lanes, reach + 1>;
 
     u8 threshold;
     int bitOffset;
 
-    template <class Stage> void fetch(Stage& stage, const tone::detail::Band& band, int first) const
+    template <int Lanes, int Lag>
+    void fetch(BitStage<Lanes, Lag>& stage, const tone::detail::Band& band, int first) const
     {
-        stage.fetch(band, first, [](const u8* row, int x) { return s32{row[x]}; });
-        for (auto& ofStep : stage.thresholds) std::fill(std::begin(ofStep), std::end(ofStep), threshold * 8192);
+        constexpr int some = 8;
+        for (int i = 0; i < stage.steps; i += some) {
+            const int t = first + i;
+            if (Lanes == some && band.rows == some && t >= Lag * (some - 1) && t <= band.width - some) {
+                turnEights(band.source + t, band.sourceStep - Lag, stage.samples[i]);
+                continue;
+            }
+            for (int r = 0; r < band.rows; ++r) {
+                const u8* const row = rowAt(band.source, band.sourceStep, r) - Lag * r;
+                const int from = std::max(t, Lag * r), to = std::min(t + some, band.width + Lag * r);
+                for (int column = from; column < to; ++column) stage.samples[column - first][r] = row[column];
+            }
+        }
     }
 
-    template <class S32>
-    PYXCC_INLINE auto operator()(const S32& sample, const S32& limit, const tone::Errors<S32>& errors) const
+    template <class Stage, class S32> PYXCC_INLINE S32 take(Stage& stage, int i, const tone::Errors<S32>& errors) const
     {
         const auto& [left, above, twoAbove] = errors;
         const S32 twice = twoAbove[1] + twoAbove[3] + above[0] + above[4];
         const S32 once = twoAbove[0] + twoAbove[4];
         const S32 fourfold = twoAbove[2] + above[1] + above[3] + left[1];
-        const S32 eightfold = above[2] + left[0];
-        const S32 sum = once + (eightfold << 3) + (fourfold << 2) + (twice << 1);
-        const S32 w = (sample << 13) + sum * S32(23);
-        const S32 isSet = isAbove(w, limit);
-        return tone::detail::Diffused<S32, S32>{(w >> 10) - (isSet & S32(2047)), isSet};
+        const S32 sum = once + (above[2] << 3) + (fourfold << 2) + (twice << 1);
+        const S32 w = (loadLanes(stage.samples[i], S32()) << 13) + sum * S32(23);
+        // What all wait for comes last: 23 times eight times the error before.
+        const S32 withLeft = (w - (left[0] << 3)) + ((left[0] << 7) + (left[0] << 6));
+        const S32 isSet = isAbove(withLeft, S32(threshold * 8192));
+        stage.results[block + i] = signsOf(isSet);
+        return (withLeft >> 10) - (isSet & S32(2047));
     }
 
-    template <class Stage> void put(const Stage& stage, const tone::detail::Band& band, int first) const
+    /// By blocks of the target. What is left of a row behind its last one stays for the next steps, but for the end of
+    /// the row.
+    template <class Stage> void put(Stage& stage, const tone::detail::Band& band, int first) const
     {
+        const auto writtenOf = [&](int x) { // of so many pixels that are there
+            return x >= band.width ? band.width : std::max(((x + bitOffset) & -block) - bitOffset, 0);
+        };
         stage.eachRow(band, first, [&](int r, int from, int to, int step) {
             const BitRow row{band.target + band.targetStep * r, bitOffset};
-            while (from < to) {
-                const int count = std::min(block, to - from);
-                u32 bits = 0;
-                for (int i = 0; i < count; ++i) bits |= (stage.results[step + i][r] & 1u) << (31 - i);
-                row.store(from, count, bits);
-                from += count;
-                step += count;
+            const u8* const results = stage.results + block + step - from;
+            const int end = writtenOf(to);
+            for (int x = writtenOf(from); x < end;) {
+                const int count = std::min(block - (x + bitOffset) % block, end - x);
+                row.store(x, count, wide::bitOfEach(loadSamples<wide::U8>(results + x), r));
+                x += count;
             }
         });
+        std::copy_n(stage.results + stage.steps, block, stage.results);
     }
 };
 

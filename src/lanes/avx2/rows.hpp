@@ -39,6 +39,10 @@ PYXCC_INLINE S32 isAbove(S32 x, S32 y) { return S32(_mm256_cmpgt_epi32(x.v, y.v)
 
 PYXCC_INLINE F32 loadLanes(const f32* p, F32) { return F32(_mm256_loadu_ps(p)); }
 PYXCC_INLINE S32 loadLanes(const s32* p, S32) { return S32(_mm256_loadu_si256(reinterpret_cast<const __m256i*>(p))); }
+PYXCC_INLINE S32 loadLanes(const u8* p, S32)
+{
+    return S32(_mm256_cvtepu8_epi32(_mm_loadl_epi64(reinterpret_cast<const __m128i*>(p))));
+}
 PYXCC_INLINE void storeLanes(f32* p, F32 x) { _mm256_storeu_ps(p, x.v); }
 PYXCC_INLINE void storeLanes(s32* p, S32 x) { _mm256_storeu_si256(reinterpret_cast<__m256i*>(p), x.v); }
 

@@ -3,6 +3,8 @@
 
 #include "lanes/avx2/floats.hpp"
 
+#include <cstddef>
+
 namespace pyxcc::layouts
 {
 
@@ -35,6 +37,24 @@ template <int times> PYXCC_INLINE void storeRepeated(f32* to, wide::F32 x)
         const __m256 repeated = times == 1 ? x.v : _mm256_permutevar8x32_ps(x.v, places);
         _mm256_storeu_ps(to + 8 * i, repeated);
     }
+}
+
+/// Eight rows of eight bytes, each `step` bytes behind the one above it, as columns: 64 bytes.
+PYXCC_INLINE void turnEights(const u8* from, std::ptrdiff_t step, u8* to)
+{
+    const auto row = [=](int y) PYXCC_INLINE_LAMBDA {
+        return _mm_loadl_epi64(reinterpret_cast<const __m128i*>(from + step * y));
+    };
+    const auto store = [=](int i, __m128i columns)
+                           PYXCC_INLINE_LAMBDA { _mm_storeu_si128(reinterpret_cast<__m128i*>(to + 16 * i), columns); };
+    const __m128i twos01 = _mm_unpacklo_epi8(row(0), row(1)), twos23 = _mm_unpacklo_epi8(row(2), row(3));
+    const __m128i twos45 = _mm_unpacklo_epi8(row(4), row(5)), twos67 = _mm_unpacklo_epi8(row(6), row(7));
+    const __m128i low = _mm_unpacklo_epi16(twos01, twos23), high = _mm_unpackhi_epi16(twos01, twos23);
+    const __m128i lowBelow = _mm_unpacklo_epi16(twos45, twos67), highBelow = _mm_unpackhi_epi16(twos45, twos67);
+    store(0, _mm_unpacklo_epi32(low, lowBelow));
+    store(1, _mm_unpackhi_epi32(low, lowBelow));
+    store(2, _mm_unpacklo_epi32(high, highBelow));
+    store(3, _mm_unpackhi_epi32(high, highBelow));
 }
 
 } // namespace pyxcc::layouts
