@@ -17,7 +17,10 @@ template <class Byte> struct C3Eights {
     static constexpr bool readsTarget = false;
 
     static PYXCC_INLINE Three<wide::F32> load(const u8* p) { return loadEightTriples<Byte>(p); }
-    static PYXCC_INLINE void store(u8* p, const Three<wide::S32>& pixels) { storeEightTriples<Byte>(p, pixels); }
+    template <class Levels> static PYXCC_INLINE void store(u8* p, const Three<Levels>& pixels)
+    {
+        storeEightTriples<Byte>(p, pixels);
+    }
 };
 
 /// The same, sixteen pixels a block: factors in, integers out.

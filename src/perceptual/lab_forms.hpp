@@ -4,6 +4,7 @@
 
 #include "frame/float_forms.hpp"
 #include "perceptual/cube_root.hpp"
+#include "perceptual/root_lines.hpp"
 #include "perceptual/smooth_root.hpp"
 #include "perceptual/xyz_of_rgb.hpp"
 
@@ -98,33 +99,26 @@ private:
     }
 };
 
-/// Blocks of bytes. Where nothing is dark, smooth roots tell L, a and b to less than a thousandth of a level: enough
-/// for all that is not as near to the middle of two levels, and less work than the table. Blocks that have such a
-/// sample, or a dark one, take the roots that count. To the nearest only: other modes lead elsewhere.
+/// Blocks of bytes. Smooth roots of x and y, and lines for z, which is dark most often, tell L, a and b to less than a
+/// thousandth of a level. A block that has one nearer to the middle of two levels, or a dark x or y, takes the roots
+/// that count. To the nearest only: other modes lead elsewhere.
 struct RgbToLabOfBytes : frame::OnFloats {
-    /// As far from a level as no other one can be meant.
-    f32 certainly = scalar::roundsToNearest() ? 0.499f : -1.0f;
+    bool toNearest = scalar::roundsToNearest();
 
     template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
     {
-        using Exact = RgbToLab<LabOfBytes, FusedSums>;
-        const auto [x, y, z] = Exact::overWhite(R, G, B);
-        if (!anyAtMost(lesser(lesser(x, y), z), F32(smoothRootsFrom))) {
-            constexpr f32 whiteL = 116 * 2.55f, blackL = -16 * 2.55f;
-            const F32 fx = smoothRoot(x), fy = smoothRoot(y), fz = smoothRoot(z);
-            const F32 L = fused(fy, F32(whiteL), F32(blackL));
-            const F32 a = fused(fx - fy, F32(500.0f), F32(128.0f)), b = fused(fy - fz, F32(200.0f), F32(128.0f));
-            const Three lab = {nearest(L), nearest(a), nearest(b)};
-            const F32 furthest = greater(greater(distance(L, lab.a), distance(a, lab.b)), distance(b, lab.c));
-            if (!anyAtMost(F32(certainly), furthest)) return lab;
-        }
-        return Exact::ofXyz(x, y, z);
-    }
-
-private:
-    template <class F32, class S32> static PYXCC_INLINE F32 distance(const F32& x, const S32& level)
-    {
-        return magnitude(x - toF32(level));
+        static constexpr Weights white = LabOfBytes::white;
+        static constexpr WeightsAndMore kx = scaledWeights(xOfRgb, white.a), ky = scaledWeights(yOfRgb, white.b),
+                                        kz = raisedWeights(zOfRgb, white.c);
+        const F32 x = weighted(kx, R, G, B), y = weighted(ky, R, G, B), z = weighted(kz, R, G, B);
+        const F32 fx = smoothRoot(x), fy = smoothRoot(y), fz = lookUp(labRootLines, z);
+        constexpr f32 whiteL = 116 * 2.55f * oneLevel, blackL = -16 * 2.55f * oneLevel + aboveLevel;
+        constexpr f32 a500 = 500 * oneLevel, b200 = 200 * oneLevel, gray = 128 * oneLevel + aboveLevel;
+        const Three lab = {fineLevel(nearest(fused(fy, F32(whiteL), F32(blackL)))),
+                           fineLevel(nearest(fused(fx - fy, F32(a500), F32(gray)))),
+                           fineLevel(nearest(fused(fy - fz, F32(b200), F32(gray))))};
+        if (toNearest && !isInDoubt(lab) && !anyAtMost(lesser(x, y), F32(smoothRootsFrom))) return lab;
+        return fineLevels(RgbToLab<LabOfBytes, FusedSums>{}(R, G, B));
     }
 };
 

@@ -5,6 +5,7 @@
 #include "frame/float_forms.hpp"
 #include "perceptual/cube_root.hpp"
 #include "perceptual/reciprocals.hpp"
+#include "perceptual/root_lines.hpp"
 #include "perceptual/xyz_of_rgb.hpp"
 
 namespace pyxcc::perceptual
@@ -25,6 +26,10 @@ template <class F32> PYXCC_INLINE F32 luvDenominator(const F32& X, const F32& Y,
 {
     return fused(Y, F32(15.0f), fused(F32(3.0f), Z, X));
 }
+
+inline constexpr Weights luvDenominatorOfRgb = {xOfRgb.a + 15 * yOfRgb.a + 3 * zOfRgb.a,
+                                                xOfRgb.b + 15 * yOfRgb.b + 3 * zOfRgb.b,
+                                                xOfRgb.c + 15 * yOfRgb.c + 3 * zOfRgb.c};
 
 template <class F32> PYXCC_INLINE LuvChroma<F32> luvChroma(const F32& X, const F32& Y, const F32& denominator)
 {
@@ -92,7 +97,7 @@ struct RgbToLuvOfFloatsTail : frame::OnFloats {
     }
 };
 
-struct RgbToLuvOfBytes : frame::OnFloats {
+struct RgbToLuvOfBytesByRoots : frame::OnFloats {
     template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
     {
         const f32 unit = 0.003921569f;
@@ -103,6 +108,32 @@ struct RgbToLuvOfBytes : frame::OnFloats {
         const F32 scale = L * 13.0f;
         return Three{nearest(L * 2.55f), nearest(fused(chroma.u, scale, F32(134.0f)) * 0.720339f),
                      nearest(fused(scale, chroma.v, F32(140.0f)) * 0.9732825f)};
+    }
+};
+
+/// Blocks of bytes. A line for L, and a reciprocal in levels of v, tell L, u and v to less than a thousandth of a
+/// level; a block that has one nearer to the middle of two levels goes by roots. To the nearest only: other modes lead
+/// elsewhere.
+struct RgbToLuvOfBytes : frame::OnFloats {
+    bool toNearest = scalar::roundsToNearest();
+
+    template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
+    {
+        constexpr f64 unit = 0.003921569f, L1 = 2.55f * oneLevel, u1 = 0.720339f * oneLevel, v1 = 0.9732825f * oneLevel;
+        // y is raised, the denominator D such that (y - black) / D is 9 Y over it in levels of v, and x to match.
+        constexpr f64 ofD = unit * raisedScale / (9 * 13 * v1), ofX = 4 * 13 * u1 * ofD;
+        static constexpr WeightsAndMore kx = scaledWeights(xOfRgb, ofX), ky = raisedWeights(yOfRgb, unit),
+                                        kd = scaledWeights(luvDenominatorOfRgb, ofD,
+                                                           1e-30f); // black is divided by something
+        const F32 x = weighted(kx, R, G, B), y = weighted(ky, R, G, B), e = refinedByFused(weighted(kd, R, G, B));
+        constexpr f32 whiteU = -un * 13 * u1, whiteV = -vn * 13 * v1;
+        const F32 L = lookUp(lightnessLines, y);
+        const F32 u = fused(x, e, F32(whiteU)), v = fused(y - ky.more, e, F32(whiteV));
+        constexpr f32 levelsOfL = L1, grayU = 134 * u1 + aboveLevel, grayV = 140 * v1 + aboveLevel;
+        const Three luv = {fineLevel(nearest(fused(L, F32(levelsOfL), F32(aboveLevel)))),
+                           fineLevel(nearest(fused(u, L, F32(grayU)))), fineLevel(nearest(fused(v, L, F32(grayV))))};
+        if (toNearest && !isInDoubt(luv)) return luv;
+        return fineLevels(RgbToLuvOfBytesByRoots{}(R, G, B));
     }
 };
 

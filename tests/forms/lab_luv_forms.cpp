@@ -25,15 +25,15 @@ template <class Form> class PerceptualFormOfBytes : public testing::Test
 {
 };
 
-using Forms = testing::Types<RgbToLab<LabOfBytes, FusedSums>, RgbToLabOfBytes, RgbToLabCut<LabOfBytes>,
-                             LabToRgb<OfLabBytes, FusedSums>, LabToRgb<OfLabBytes, PlainSums>, RgbToLuvOfBytes,
-                             RgbToLuvByPower, LuvToRgbOfBytesC3, LuvToRgbOfBytesAC4, LuvToRgbTail<255>>;
+using Forms = testing::Types<RgbToLab<LabOfBytes, FusedSums>, RgbToLabCut<LabOfBytes>, LabToRgb<OfLabBytes, FusedSums>,
+                             LabToRgb<OfLabBytes, PlainSums>, RgbToLuvOfBytesByRoots, RgbToLuvByPower,
+                             LuvToRgbOfBytesC3, LuvToRgbOfBytesAC4, LuvToRgbTail<255>>;
 
 struct Names {
     template <class Form> static std::string GetName(int i)
     {
-        return std::array{"rgbToLab", "rgbToLabInBlocks", "rgbToLabTail", "labToRgb",    "labToRgbTail",
-                          "rgbToLuv", "rgbToLuvByPower",  "luvToRgb",     "luvToRgbAC4", "luvToRgbTail"}[i];
+        return std::array{"rgbToLab",        "rgbToLabTail", "labToRgb",    "labToRgbTail", "rgbToLuv",
+                          "rgbToLuvByPower", "luvToRgb",     "luvToRgbAC4", "luvToRgbTail"}[i];
     }
 };
 
@@ -93,6 +93,50 @@ TEST(SmoothRoot, IsNearTheExactOne)
         EXPECT_NEAR(smoothRoot(scalar::F32(v)).v, std::cbrt(static_cast<f64>(v)), 7e-7) << v;
     }
     EXPECT_NEAR(smoothRoot(scalar::F32(1.00001f)).v, 1, 7e-7);
+}
+
+// The roots that count come of four terms of the series, or are on a line near black. What is looked up is raised: rows
+// of the table begin at 128ths, and black at two of them.
+TEST(RootLines, AreNearTheRootsThatCount)
+{
+    const auto raised = [](f32 v) { return scalar::F32((v * 127.998046875f + 2) / 128); };
+    for (int i = 0; i <= 100000; ++i) {
+        const f32 v = static_cast<f32>(i) / 100000;
+        if (std::abs(v - 0.008856f) < 1e-4f) continue; // lines on both sides of it only
+        const scalar::F32 root =
+            rootByFourTerms(rootStartWithin(labCubeRootTable, labRow(scalar::F32(v)), scalar::F32(v)));
+        const f32 f = v < 0.008856f ? 7.787f * v + 0.13793103f : root.v;
+        const f32 L = v < 0.008856f ? 903.3f * v : 116 * root.v - 16;
+        EXPECT_NEAR(lookUp(labRootLines, raised(v)).v, f, 6e-7) << v;
+        EXPECT_NEAR(lookUp(lightnessLines, raised(v)).v, L, 6e-5) << v;
+    }
+    EXPECT_TRUE(std::isnan(lookUp(labRootLines, raised(0.008856f)).v));
+}
+
+TEST(RootLines, ReachBeyondWhite)
+{
+    const scalar::F32 white(255);
+    const auto raised = [white](const Weights& k, f64 scale) {
+        return weighted(raisedWeights(k, scale), white, white, white).v;
+    };
+    const f32 end = labRootLines.from(static_cast<int>(labRootLines.line.size()));
+    EXPECT_LT(raised(zOfRgb, LabOfBytes::white.c), end);
+    EXPECT_LT(raised(yOfRgb, 0.003921569f), end);
+}
+
+// A level has 65536 parts.
+TEST(FineLevels, AreToldFromThoseNearTheNextOne)
+{
+    const auto any = [](int a, int b, int c) {
+        const Three levels = {fineLevel(scalar::S32(a)), fineLevel(scalar::S32(b)), fineLevel(scalar::S32(c))};
+        const Three registers = {fineLevel(wide::S32(a)), fineLevel(wide::S32(b)), fineLevel(wide::S32(c))};
+        EXPECT_EQ(anyFractionBelow(levels, 80), anyFractionBelow(registers, 80)) << a << ' ' << b << ' ' << c;
+        return anyFractionBelow(levels, 80);
+    };
+    EXPECT_FALSE(any(80, 65535, 3 * 65536 + 80));
+    EXPECT_TRUE(any(79, 65535, 3 * 65536 + 80));
+    EXPECT_TRUE(any(80, 5 * 65536, 3 * 65536 + 80));
+    EXPECT_TRUE(any(80, 65535, 255 * 65536 + 79));
 }
 
 using Interleaved = PyxStatus (*)(const u8*, int, u8*, int, RoiSize);

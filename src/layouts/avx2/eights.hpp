@@ -2,6 +2,7 @@
 // of a register, and fewer registers at a time.
 #pragma once
 
+#include "lanes/avx2/fine_levels.hpp"
 #include "lanes/avx2/pixels.hpp"
 #include "layouts/avx2/interleave.hpp"
 
@@ -159,6 +160,28 @@ template <class Byte> PYXCC_INLINE Three<wide::F32> loadEightTriples(const u8* p
 template <class Byte> PYXCC_INLINE void storeEightTriples(u8* p, const Three<wide::S32>& pixels)
 {
     detail::storeTwelves(p, detail::shuffle(detail::foursOfChannels<Byte>(pixels), detail::byPixels(3)));
+}
+
+namespace detail
+{
+
+/// The sources of a shuffle that brings the levels of channel `c` to where they go in pixels of three bytes.
+constexpr Places ofFineLevels(int c)
+{
+    Places places{};
+    for (int i = 0; i < 16; ++i) places[i] = i < 12 && i % 3 == c ? static_cast<u8>(i / 3 * 4 + 2) : 0x80;
+    return places;
+}
+
+} // namespace detail
+
+/// The same with what is behind the point cut off.
+template <class Byte> PYXCC_INLINE void storeEightTriples(u8* p, const Three<FineLevel<wide::S32>>& pixels)
+{
+    using namespace detail;
+    static constexpr Places a = ofFineLevels(0), b = ofFineLevels(1), c = ofFineLevels(2);
+    const __m256i ab = _mm256_or_si256(shuffle(pixels.a.in65536ths.v, a), shuffle(pixels.b.in65536ths.v, b));
+    storeTwelves(p, _mm256_or_si256(ab, shuffle(pixels.c.in65536ths.v, c)));
 }
 
 /// Reads the first three bytes of 8 pixels of four.
