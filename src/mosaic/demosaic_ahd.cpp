@@ -89,7 +89,11 @@ private:
 
     bool isGreenFirst(s32 y) const { return isGreen(siteAt(work_.grid, x_ - 3, y)); }
 
-    void fillMosaic(s32 y) { work_.mosaic.take(y, x_ - 5, x_ + width_ + 5, mosaic_[y].at(-2)); }
+    void fillMosaic(s32 y)
+    {
+        work_.mosaic.expect(y + rowsAhead, x_ - 5, x_ + width_ + 5);
+        work_.mosaic.take(y, x_ - 5, x_ + width_ + 5, mosaic_[y].at(-2));
+    }
 
     void fillGreen(s32 y)
     {
@@ -150,6 +154,27 @@ private:
         }
     };
 
+    /// Rows of a stretch are too short for the processor to look ahead of: hints do, at the same columns some rows
+    /// below.
+    static constexpr int rowsAhead = 6;
+
+    struct TargetRow {
+        static constexpr int block = Samples::count;
+        InterleavedRow<C3<Samples>, u8> row;
+        std::ptrdiff_t ahead;
+
+        PYXCC_INLINE void store(int x, const pyxcc::Three<Samples>& pixels) const
+        {
+            u8* const at = row.pixel(x);
+            expectFrom<0>(at + ahead);
+            row.packing.store(at, pixels);
+        }
+        PYXCC_INLINE void store(int x, int count, const pyxcc::Three<Samples>& pixels) const
+        {
+            row.store(x, count, pixels);
+        }
+    };
+
     void emit(s32 y, u32& last)
     {
         const auto planes = [y](Candidate& from) {
@@ -159,7 +184,7 @@ private:
                                   planes(alongRow_),
                                   planes(alongColumn_),
                                   last};
-        const InterleavedRow<C3<Samples>, u8, Hints::near> target{targetRow(y), {}};
+        const TargetRow target{{targetRow(y), {}}, std::ptrdiff_t{work_.targetStep} * rowsAhead};
         convertColumns(source, target, 0, width_, Unchanged{});
     }
 

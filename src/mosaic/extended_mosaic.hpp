@@ -32,6 +32,14 @@ template <class T> struct ExtendedMosaic {
         }
     }
 
+    /// Hints at samples that are taken soon.
+    void expect(s32 y, s32 from, s32 to) const
+    {
+        constexpr int size = sizeof(T);
+        const u8* const row = layouts::rowAt(layouts::bytes(first), step, y);
+        for (s32 x = from; x < to; x += 128 / size) layouts::expectFrom<0>(row + std::ptrdiff_t{x} * size);
+    }
+
 private:
     static s32 mirrored(s32 place, s32 last)
     {
