@@ -29,14 +29,14 @@ template <int Columns> struct LumaChroma<u16, Columns> {
 /// How far the pixels of a row are from neighbours.
 template <class T, int Columns> struct Distances;
 
-/// A sum of two squares of chroma is below 65536: the largest is that of green and magenta.
+/// A sum of two squares of chroma is below 65536: the largest is that of green and magenta. It is kept 32768 less,
+/// which is how it is compared in 16 bits.
 template <int Columns> struct Distances<u8, Columns> {
     Line<s16, Columns> luma;
-    Line<u16, Columns> chroma;
+    Line<s16, Columns> chroma;
 };
 
-/// Distances of luma are 32768 less than they are, which is how they are compared in 16 bits. Sums of squares may leave
-/// 32 bits, and wrap.
+/// Distances of luma are 32768 less than they are, too. Sums of squares may leave 32 bits, and wrap.
 template <int Columns> struct Distances<u16, Columns> {
     Line<s16, Columns> luma;
     Line<s32, Columns / 2> even, odd;
@@ -110,12 +110,12 @@ void measure(const LumaChroma<u8, Columns>& a, const LumaChroma<u8, Columns>& b,
     const s16 *const ay = a.y.at(), *const acb = a.cb.at(), *const acr = a.cr.at();
     const s16 *const by = b.y.at(further), *const bcb = b.cb.at(further), *const bcr = b.cr.at(further);
     s16* __restrict const luma = to.luma.at();
-    u16* __restrict const chroma = to.chroma.at();
+    s16* __restrict const chroma = to.chroma.at();
     for (int x = 0; x < count; ++x) {
         const auto y = static_cast<s16>(ay[x] - by[x]);
         luma[x] = static_cast<s16>(y < 0 ? -y : y);
         const auto cb = static_cast<s16>(acb[x] - bcb[x]), cr = static_cast<s16>(acr[x] - bcr[x]);
-        chroma[x] = static_cast<u16>(cb * cb + cr * cr);
+        chroma[x] = static_cast<s16>(cb * cb + cr * cr - 32768);
     }
 }
 
@@ -184,15 +184,15 @@ void scoreCandidates(const DistancesAround<u8, Columns>& h, const DistancesAroun
                      *const hBelow = h.below.luma.at();
     const s16 *const vBeside = v.beside.luma.at(-1), *const vAbove = v.above.luma.at(),
                      *const vBelow = v.below.luma.at();
-    const u16 *const hBesideC = h.beside.chroma.at(-1), *const vBesideC = v.beside.chroma.at(-1);
-    const u16 *const hAboveC = h.above.chroma.at(), *const hBelowC = h.below.chroma.at();
-    const u16 *const vAboveC = v.above.chroma.at(), *const vBelowC = v.below.chroma.at();
+    const s16 *const hBesideC = h.beside.chroma.at(-1), *const vBesideC = v.beside.chroma.at(-1);
+    const s16 *const hAboveC = h.above.chroma.at(), *const hBelowC = h.below.chroma.at();
+    const s16 *const vAboveC = v.above.chroma.at(), *const vBelowC = v.below.chroma.at();
     alignas(32) s16 more[Columns]; // in a row of its own, or else the compiler narrows each comparison
     for (int x = 0; x < count; ++x) {
         const s16 limit = std::min(std::max(hBeside[x], hBeside[x + 1]), std::max(vAbove[x], vBelow[x]));
-        const u16 limitC = std::min(std::max(hBesideC[x], hBesideC[x + 1]), std::max(vAboveC[x], vBelowC[x]));
+        const s16 limitC = std::min(std::max(hBesideC[x], hBesideC[x + 1]), std::max(vAboveC[x], vBelowC[x]));
         // -1 for what is too far: comparisons are masks.
-        const auto isBeyond = [&](s16 luma, u16 chroma) {
+        const auto isBeyond = [&](s16 luma, s16 chroma) {
             const s16 far = luma > limit ? -1 : 0, farC = chroma > limitC ? -1 : 0;
             return static_cast<s16>(far | farC);
         };
