@@ -243,11 +243,11 @@ private:
         using wide::F32;
         const auto entries = [](int row) PYXCC_INLINE_LAMBDA { return layouts::loadFoursTwice(matrix[row]); };
         const Four<F32> entriesOf = {entries(0), entries(1), entries(2), entries(3)};
+        const F32 step = step_;
         for (int x = 0; x < pixels_; x += F32::count) {
             const Four<F32> amounts = noise_.load(x, y);
             const auto store = [&](int row, F32 entry, F32 noise) PYXCC_INLINE_LAMBDA {
-                layouts::storeRepeated<Pixel::samples>(rows_[row].of + samplesIn<Pixel>(x),
-                                                       F32(step_) * (entry + noise));
+                layouts::storeRepeated<Pixel::samples>(rows_[row].of + samplesIn<Pixel>(x), step * (entry + noise));
             };
             store(0, entriesOf.a, amounts.a);
             store(1, entriesOf.b, amounts.b);

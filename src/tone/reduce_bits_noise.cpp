@@ -30,12 +30,11 @@ void Noise::abandon()
 NoiseByColumns::NoiseByColumns(const Noise& noise)
 {
     for (int odd = 0; odd < 2; ++odd) {
-        for (int i = 0; i < half + atOnce; ++i)
-            amounts_[2 * half * odd + i] = noise.amounts[(2 * i + odd) % Noise::length];
+        for (int i = 0; i < whole; ++i) amounts_[whole * odd + i] = noise.amounts[(2 * i + odd) % Noise::length];
     }
     for (int x = 0; x < Noise::length; ++x) {
         const int place = noise.offsets[x] + x;
-        placeOf_[x] = (place / 2) % half + 2 * half * (place % 2);
+        placeOf_[x] = static_cast<u16>((place / 2) % half + whole * (place % 2));
     }
 }
 

@@ -48,17 +48,15 @@ public:
     /// Those of four rows from `y` on and of eight columns from `x` on, which is below the length of the tables.
     PYXCC_INLINE Four<wide::F32> load(int x, int y) const
     {
-        const wide::S32 places = (wide::loadLanes(placeOf_ + x, wide::S32()) + wide::S32(y % half)) & wide::S32(~half);
-        s32 placeOf[wide::S32::count];
-        wide::storeLanes(placeOf, places);
-        return layouts::loadColumns(amounts_, placeOf);
+        return layouts::loadColumns(amounts_ + static_cast<u32>(y) % half, placeOf_ + x);
     }
 
 private:
-    static constexpr int half = Noise::length / 2, atOnce = 4;
+    static constexpr int half = Noise::length / 2;
+    static constexpr int whole = 2 * half + 4; ///< the half a second time, as a row begins anywhere, and rows at once
 
-    f32 amounts_[3 * half + atOnce]; ///< the even ones, with some from the front behind them, and from 2 * half the odd
-    s32 placeOf_[Noise::length];     ///< in row 0
+    f32 amounts_[2 * whole];     ///< the even ones, then the odd ones
+    u16 placeOf_[Noise::length]; ///< in row 0
 };
 
 } // namespace pyxcc::tone

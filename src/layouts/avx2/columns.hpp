@@ -9,7 +9,7 @@ namespace pyxcc::layouts
 {
 
 /// Four floats from each of eight places on: the first ones, the second ones and so on.
-PYXCC_INLINE Four<wide::F32> loadColumns(const f32* floats, const s32* places)
+PYXCC_INLINE Four<wide::F32> loadColumns(const f32* floats, const u16* places)
 {
     const auto fours = [=](int i) PYXCC_INLINE_LAMBDA {
         return _mm256_set_m128(_mm_loadu_ps(floats + places[i + 4]), _mm_loadu_ps(floats + places[i]));
