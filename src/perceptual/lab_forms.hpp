@@ -2,7 +2,7 @@
 // the one and which the other shows in the last bit.
 #pragma once
 
-#include "frame/float_forms.hpp"
+#include "frame/two_steps.hpp"
 #include "perceptual/cube_root.hpp"
 #include "perceptual/root_lines.hpp"
 #include "perceptual/smooth_root.hpp"
@@ -26,9 +26,13 @@ template <class F32> PYXCC_INLINE auto labRow(const F32& v) { return trunc(v * l
 struct LabOfFloats {
     static constexpr Weights white = {1.0521265f, 1.0f, 0.91848117f};
 
-    template <class F32> static PYXCC_INLINE F32 root(const F32& v)
+    template <class F32> static PYXCC_INLINE auto start(const F32& v)
     {
-        return rootByEightTerms(rootStart(labCubeRootTable, labRow(v), v), labLastTermsOfFloats);
+        return rootStart(labCubeRootTable, labRow(v), v);
+    }
+    template <class F32> static PYXCC_INLINE F32 root(const RootStart<F32>& start)
+    {
+        return rootByEightTerms(start, labLastTermsOfFloats);
     }
     template <class Sums, class F32> static PYXCC_INLINE Three<F32> stored(const F32& L, const F32& a, const F32& b)
     {
@@ -39,10 +43,11 @@ struct LabOfFloats {
 struct LabOfBytes {
     static constexpr Weights white = {0.0041259914f, 0.003921569f, 0.0036018905f};
 
-    template <class F32> static PYXCC_INLINE F32 root(const F32& v)
+    template <class F32> static PYXCC_INLINE auto start(const F32& v)
     {
-        return rootByFourTerms(rootStartWithin(labCubeRootTable, labRow(v), v));
+        return rootStartWithin(labCubeRootTable, labRow(v), v);
     }
+    template <class F32> static PYXCC_INLINE F32 root(const RootStart<F32>& start) { return rootByFourTerms(start); }
 
     template <class Sums, class F32> static PYXCC_INLINE auto stored(const F32& L, const F32& a, const F32& b)
     {
@@ -55,9 +60,13 @@ struct LabOfBytes {
 struct LabOfWords {
     static constexpr Weights white = LabOfBytes::white;
 
-    template <class F32> static PYXCC_INLINE F32 root(const F32& v)
+    template <class F32> static PYXCC_INLINE auto start(const F32& v)
     {
-        return rootByEightTerms(rootStartWithin(labCubeRootTable, labRow(v), v), labLastTermsOfWords);
+        return rootStartWithin(labCubeRootTable, labRow(v), v);
+    }
+    template <class F32> static PYXCC_INLINE F32 root(const RootStart<F32>& start)
+    {
+        return rootByEightTerms(start, labLastTermsOfWords);
     }
     template <class Sums, class F32> static PYXCC_INLINE auto stored(const F32& L, const F32& a, const F32& b)
     {
@@ -68,10 +77,17 @@ struct LabOfWords {
 };
 
 template <class Depth, class Sums> struct RgbToLab : frame::OnFloats {
-    template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
+    static constexpr bool inTwoSteps = true;
+
+    template <class F32> struct Begun {
+        Three<F32> xyz;
+        Three<RootStart<F32>> start;
+    };
+
+    template <class F32> PYXCC_INLINE Begun<F32> begin(const F32& R, const F32& G, const F32& B) const
     {
         const auto [x, y, z] = overWhite(R, G, B);
-        return ofXyz(x, y, z);
+        return {{x, y, z}, {Depth::start(x), Depth::start(y), Depth::start(z)}};
     }
 
     template <class F32> static PYXCC_INLINE Three<F32> overWhite(const F32& R, const F32& G, const F32& B)
@@ -80,9 +96,10 @@ template <class Depth, class Sums> struct RgbToLab : frame::OnFloats {
         return {X * Depth::white.a, Y * Depth::white.b, Z * Depth::white.c};
     }
 
-    template <class F32> static PYXCC_INLINE auto ofXyz(const F32& x, const F32& y, const F32& z)
+    template <class F32> PYXCC_INLINE auto end(const Begun<F32>& begun) const
     {
-        Three<F32> f = {Depth::root(x), Depth::root(y), Depth::root(z)};
+        const auto& [x, y, z] = begun.xyz;
+        Three<F32> f = {Depth::root(begun.start.a), Depth::root(begun.start.b), Depth::root(begun.start.c)};
         F32 L = Sums::productAndSum(f.b, F32(116.0f), F32(-16.0f));
         // Most blocks have nothing so dark, and are spared the choices.
         if (anyAtMost(lesser(lesser(x, y), z), F32(labLimit))) {
@@ -90,6 +107,11 @@ template <class Depth, class Sums> struct RgbToLab : frame::OnFloats {
             f = {rootOrLine(x, f.a), rootOrLine(y, f.b), rootOrLine(z, f.c)};
         }
         return Depth::template stored<Sums>(L, f.a - f.b, f.b - f.c);
+    }
+
+    template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
+    {
+        return end(begin(R, G, B));
     }
 
 private:

@@ -2,7 +2,7 @@
 // in what is tested for black, and in how results become integers.
 #pragma once
 
-#include "frame/float_forms.hpp"
+#include "frame/two_steps.hpp"
 #include "perceptual/cube_root.hpp"
 #include "perceptual/reciprocals.hpp"
 #include "perceptual/root_lines.hpp"
@@ -69,18 +69,35 @@ PYXCC_INLINE F32 lightnessInBlocks(const F32& Y, const F32& limit, const F32& on
 
 /// Floats. The rows of the table up to 1 are counted as 128, or as a little less.
 struct RgbToLuvOfFloats : frame::OnFloats {
+    static constexpr bool inTwoSteps = true;
     f32 rowsToOne;
 
     constexpr explicit RgbToLuvOfFloats(f32 rows) : rowsToOne(rows) {}
 
-    template <class F32> PYXCC_INLINE Three<F32> operator()(const F32& R, const F32& G, const F32& B) const
+    template <class F32> struct Begun {
+        F32 Y;
+        RootStart<F32> start;
+        LuvChroma<F32> chroma;
+    };
+
+    template <class F32> PYXCC_INLINE Begun<F32> begin(const F32& R, const F32& G, const F32& B) const
     {
         const auto [X, Y, Z] = multiplied<FusedSums>(xyzOfRgb, R, G, B);
-        const F32 root = rootByEightTerms(rootStart(luvCubeRootTable, trunc(Y * rowsToOne), Y), luvLastTerms);
+        return {Y, rootStart(luvCubeRootTable, trunc(Y * rowsToOne), Y), luvChromaInBlocks(X, Y, Z)};
+    }
+
+    template <class F32> PYXCC_INLINE Three<F32> end(const Begun<F32>& begun) const
+    {
+        const auto& [Y, start, chroma] = begun;
+        const F32 root = rootByEightTerms(start, luvLastTerms);
         const F32 L = lightnessInBlocks(Y, F32(luvLimit), Y * 903.3f, fused(F32(116.0f), root, F32(-16.0f)));
-        const LuvChroma<F32> chroma = luvChromaInBlocks(X, Y, Z);
         const F32 scale = L * 13.0f;
         return {L, chroma.u * scale, scale * chroma.v};
+    }
+
+    template <class F32> PYXCC_INLINE Three<F32> operator()(const F32& R, const F32& G, const F32& B) const
+    {
+        return end(begin(R, G, B));
     }
 };
 
@@ -147,16 +164,33 @@ template <class F32> PYXCC_INLINE Three<F32> scaledToWords(const F32& L, const F
 }
 
 struct RgbToLuvOfWords : frame::OnFloats {
-    template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
+    static constexpr bool inTwoSteps = true;
+
+    template <class F32> struct Begun {
+        F32 Y;
+        RootStart<F32> start;
+        LuvChroma<F32> chroma;
+    };
+
+    template <class F32> PYXCC_INLINE Begun<F32> begin(const F32& R, const F32& G, const F32& B) const
     {
         const auto [X, Y, Z] = multiplied<FusedSums>(xyzOfRgb, R, G, B);
-        const F32 y = Y * wordUnit;
-        const F32 root = rootBySixTerms(rootStartWithin(luvCubeRootTable, trunc(Y) >> 9, y));
-        const F32 L = lightnessInBlocks(Y, F32(luvLimitOfWords), y * 903.3f, root * 116.0f - 16.0f);
-        const LuvChroma<F32> chroma = luvChromaOfSamples(X, Y, Z);
+        return {Y, rootStartWithin(luvCubeRootTable, trunc(Y) >> 9, Y * wordUnit), luvChromaOfSamples(X, Y, Z)};
+    }
+
+    template <class F32> PYXCC_INLINE auto end(const Begun<F32>& begun) const
+    {
+        const F32 y = begun.Y * wordUnit;
+        const F32 root = rootBySixTerms(begun.start);
+        const F32 L = lightnessInBlocks(begun.Y, F32(luvLimitOfWords), y * 903.3f, root * 116.0f - 16.0f);
         const F32 scale = L * 13.0f;
-        const auto [l, u, v] = scaledToWords(L, chroma.u * scale, scale * chroma.v);
+        const auto [l, u, v] = scaledToWords(L, begun.chroma.u * scale, scale * begun.chroma.v);
         return Three{nearest(l), nearest(u), nearest(v)};
+    }
+
+    template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
+    {
+        return end(begin(R, G, B));
     }
 };
 
