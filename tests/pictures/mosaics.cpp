@@ -12,6 +12,7 @@
 #include <fstream>
 #include <iostream>
 #include <limits>
+#include <random>
 #include <stdexcept>
 #include <string>
 #include <type_traits>
@@ -64,6 +65,15 @@ template <class T> struct Mosaic {
                                       ? static_cast<T>(sample)
                                       : static_cast<T>(sample * 256 + (sample * 37 + x * 11 + y * 29) % 256));
             }
+        }
+    }
+
+    /// Black and white at random. Many sums of scores are zero, and so many places do as those in front of them.
+    Mosaic(RoiSize of, int colors) : size(of), grid(colors)
+    {
+        std::mt19937 numbers(static_cast<unsigned>(colors));
+        for (int i = 0; i < size.width * size.height; ++i) {
+            samples.push_back(numbers() % 2 == 0 ? T{0} : std::numeric_limits<T>::max());
         }
     }
 
@@ -171,7 +181,23 @@ template <class Method, class T> void expectRegionsAsStated(const Picture& pictu
     std::cout << unlikeTheWhole << " of " << pixels << " pixels of regions are not those of the whole\n";
 }
 
+template <class T> void expectWideAndHighAsStated()
+{
+    for (const RoiSize size : {RoiSize{1111, 24}, {21, 2111}}) {
+        for (int grid = 0; grid < 4; ++grid) {
+            const Mosaic<T> mosaic(size, grid);
+            EXPECT_TRUE(ByHomogeneity::convert(mosaic, mosaic.whole(), true).samples ==
+                        ByHomogeneity::convert(mosaic, mosaic.whole(), false).samples)
+                << "grid " << grid << ", width " << size.width;
+        }
+    }
+}
+
 } // namespace
+
+// However wide and high a mosaic is, whole rows do as they begin.
+TEST(MosaicsAtRandom, ByHomogeneityOfBytes) { expectWideAndHighAsStated<u8>(); }
+TEST(MosaicsAtRandom, ByHomogeneityOfWords) { expectWideAndHighAsStated<u16>(); }
 
 TEST(MosaicsOfAPhotograph, InOnePassOfBytes) { expectRegionsAsStated<InOnePass, u8>(readPicture()); }
 TEST(MosaicsOfAPhotograph, InOnePassOfWords) { expectRegionsAsStated<InOnePass, u16>(readPicture()); }
