@@ -46,6 +46,14 @@ concept StoredLate = requires
     requires Form::storedLate;
 };
 
+/// A source that takes little to load: a block of it need not be on its way while the one in front is computed, but
+/// takes up registers.
+template <class Source>
+concept LoadedAtOnce = requires
+{
+    requires Source::loadedAtOnce;
+};
+
 /// Takes whole blocks through such a form, from `x` on, and returns where they end.
 template <class Source, class Target, class Form>
 PYXCC_INLINE int convertBlocksStoredLate(const Source& source, const Target& target, int x, int to, const Form& form)
@@ -79,6 +87,8 @@ PYXCC_INLINE void convertColumns(const Source& source, const Target& target, int
         // None is whole.
     } else if constexpr (StoredLate<Form>) {
         x = convertBlocksStoredLate(source, target, x, to, form);
+    } else if constexpr (LoadedAtOnce<Source>) {
+        for (; x <= to - block; x += block) target.store(x, apply(form, source.load(x)));
     } else {
         // Each block is loaded before the one in front of it is stored: taking interleaved pixels apart is a long chain
         // of shuffles, which so runs beside the form's instead of in front of it.

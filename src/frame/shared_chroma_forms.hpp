@@ -57,6 +57,20 @@ PYXCC_INLINE auto apply(const Form& form, const layouts::ChromaOfPairs<Luma>& pi
     }
 }
 
+/// A form that takes chroma of packed pixels where it lies.
+template <class Form>
+concept OnPackedChroma = requires(layouts::ChromaInPlace<0, false> chroma)
+{
+    Form::sharesInPlace(chroma);
+};
+
+template <OnPackedChroma Form, int First, bool Exchanged>
+PYXCC_INLINE auto apply(const Form&, const layouts::PixelsInTurn<First, Exchanged>& pixels)
+{
+    return narrowAll(Form::add(pixels.luma.a, Form::sharesInPlace(pixels.inPlace.a)),
+                     Form::add(pixels.luma.b, Form::sharesInPlace(pixels.inPlace.b)));
+}
+
 /// One row adds it to its even columns and to its odd ones, which saves laying it beside them.
 template <std::derived_from<AddedToLuma> Form>
 PYXCC_INLINE auto apply(const Form&, const layouts::ChromaOfPairs<wide::U8>& pixels)

@@ -89,9 +89,10 @@ template <Order order = Order::ofMemory, class Sample> auto c4(Sample* first, st
 }
 
 /// A target whose fourth channel is set.
-template <class Sample> auto c4(Sample* first, std::ptrdiff_t step, std::type_identity_t<Sample> fourth)
+template <Order order = Order::ofMemory, class Sample>
+auto c4(Sample* first, std::ptrdiff_t step, std::type_identity_t<Sample> fourth)
 {
-    return detail::interleaved(first, step, C4Set<detail::RegisterOf<Sample>>{fourth});
+    return detail::interleaved(first, step, C4Set<detail::RegisterOf<Sample>, order>{fourth});
 }
 
 /// Pixels of 1, 3 or 4 samples, for forms to which all channels are alike; a fourth takes no part, and a target keeps

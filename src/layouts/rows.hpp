@@ -54,7 +54,7 @@ template <class Register, Order order = Order::ofMemory> struct C4 {
 };
 
 /// Four interleaved samples a pixel, the fourth set.
-template <class Register> struct C4Set {
+template <class Register, Order order = Order::ofMemory> struct C4Set {
     using Samples = Register;
     static constexpr int pixelBytes = 4 * sampleBytes<Samples>;
     static constexpr bool readsTarget = false;
@@ -62,7 +62,7 @@ template <class Register> struct C4Set {
 
     PYXCC_INLINE void store(u8* p, const Three<Samples>& pixels) const
     {
-        storeQuadruples(p, Four<Samples>{pixels.a, pixels.b, pixels.c, fourth});
+        storeQuadruples<order>(p, Four<Samples>{pixels.a, pixels.b, pixels.c, fourth});
     }
 };
 
@@ -117,9 +117,13 @@ template <class Packing> inline constexpr int blockOf = Packing::Samples::count;
 template <class Register, int PixelSamples>
 inline constexpr int blockOf<AsTheyLie<Register, PixelSamples>> = AsTheyLie<Register, PixelSamples>::block;
 
+/// Whether pixels come as forms take them, with no more than a load.
+template <class Packing> inline constexpr bool loadsAtOnce = requires { requires Packing::loadedAtOnce; };
+
 template <class Packing, class Byte, Hints hints = Hints::far> struct InterleavedRow {
     static constexpr int block = blockOf<Packing>;
     static constexpr int pixelBytes = Packing::pixelBytes;
+    static constexpr bool loadedAtOnce = loadsAtOnce<Packing>;
     Byte* at;
     Packing packing;
 

@@ -32,6 +32,19 @@ template <int Columns, class Luma> using ChromaOfSums = SharedChroma<Columns, Lu
 /// What a source gives: chroma as words, a sample for every pair. Samples of fours come twice.
 template <class Luma> using ChromaOfPairs = SharedChroma<2, Luma, Two<wide::Sample>>;
 
+/// The same of packed pixels: chroma is at hand as it lies beside luma, too, 16 pixels each.
+template <int First, bool Exchanged> struct PixelsInTurn : ChromaOfPairs<Two<wide::Sample>> {
+    Two<ChromaInPlace<First, Exchanged>> inPlace;
+};
+
+template <class T> PYXCC_INLINE Two<T> exchanged(const Two<T>& x) { return {x.b, x.a}; }
+
+template <int First, bool Exchanged>
+PYXCC_INLINE PixelsInTurn<First, !Exchanged> exchanged(const PixelsInTurn<First, Exchanged>& x)
+{
+    return {{x.luma, exchanged(x.chroma)}, {{x.inPlace.a.pixels}, {x.inPlace.b.pixels}}};
+}
+
 /// Whether columns that do not fill a block have chroma in a target of planes.
 enum class Rest { lumaOnly, withChroma };
 
@@ -80,8 +93,6 @@ private:
     }
 };
 
-template <class T> PYXCC_INLINE Two<T> exchanged(const Two<T>& x) { return {x.b, x.a}; }
-
 /// A row of one plane of chroma pairs, the second component first if `Exchanged`.
 template <class Byte, bool Exchanged, Order Within = Order::ofMemory> struct ChromaPairsRow {
     static constexpr int columns = 2;
@@ -109,6 +120,7 @@ private:
 /// One row of luma, or two, and the row of chroma that goes with it.
 template <class LumaRow, class ChromaRow> struct SharedChromaRow {
     static constexpr int block = LumaRow::block;
+    static constexpr bool loadedAtOnce = true;
     LumaRow luma;
     ChromaRow chroma;
 
@@ -194,11 +206,12 @@ template <Order order> struct LumaFirst {
     using Samples = wide::U8;
     static constexpr int pixelBytes = 2;
     static constexpr bool readsTarget = false;
+    static constexpr bool loadedAtOnce = true;
 
-    static PYXCC_INLINE ChromaOfPairs<Two<wide::Sample>> load(const u8* p)
+    static PYXCC_INLINE PixelsInTurn<1, false> load(const u8* p)
     {
-        const Two<wide::U8> pixels = loadForWidening(p);
-        return {{lowBytes(pixels.a), lowBytes(pixels.b)}, chromaOfPairs<1>(pixels)};
+        const Two<wide::U8> pixels = loadForWidening<order>(p);
+        return {{{lowBytes(pixels.a), lowBytes(pixels.b)}, chromaOfPairs<1>(pixels)}, {{pixels.a}, {pixels.b}}};
     }
 
     static PYXCC_INLINE void store(u8* p, const ChromaOfSums<2, wide::U8>& pixels)
@@ -232,11 +245,12 @@ template <Order order> struct ChromaFirst {
     using Samples = wide::U8;
     static constexpr int pixelBytes = 2;
     static constexpr bool readsTarget = false;
+    static constexpr bool loadedAtOnce = true;
 
-    static PYXCC_INLINE ChromaOfPairs<Two<wide::Sample>> load(const u8* p)
+    static PYXCC_INLINE PixelsInTurn<0, false> load(const u8* p)
     {
-        const Two<wide::U8> pixels = loadForWidening(p);
-        return {{highBytes(pixels.a), highBytes(pixels.b)}, chromaOfPairs<0>(pixels)};
+        const Two<wide::U8> pixels = loadForWidening<order>(p);
+        return {{{highBytes(pixels.a), highBytes(pixels.b)}, chromaOfPairs<0>(pixels)}, {{pixels.a}, {pixels.b}}};
     }
 
     static PYXCC_INLINE void store(u8* p, const ChromaOfSums<2, wide::U8>& pixels)
@@ -260,12 +274,7 @@ template <Order order> struct ChromaFirstFromBefore : ChromaFirst<order> {
 
 /// A packing with its two chroma components exchanged.
 template <class Packing> struct ChromaExchanged : Packing {
-    static PYXCC_INLINE auto load(const u8* p)
-    {
-        auto pixels = Packing::load(p);
-        pixels.chroma = exchanged(pixels.chroma);
-        return pixels;
-    }
+    static PYXCC_INLINE auto load(const u8* p) { return exchanged(Packing::load(p)); }
 
     static PYXCC_INLINE void store(u8* p, const ChromaOfSums<2, wide::U8>& pixels)
     {

@@ -55,6 +55,6 @@ PyxStatus PYXCC_CALL pyxiCbYCr422ToRGB_8u_C2C3R(const u8* src, int srcStep, u8* 
 PyxStatus PYXCC_CALL pyxiCbYCr422ToBGR_8u_C2C4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi, u8 aval)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return eachRow(roi, c2ChromaFirstFromBefore(src, srcStep), reversed(c4(dst, dstStep, aval)),
-                   wideThenTail<8>(invHighD, invExactD));
+    return eachRow(roi, c2ChromaFirstFromBefore<Order::ofWords>(src, srcStep),
+                   reversed(c4<Order::ofWords>(dst, dstStep, aval)), wideThenTail<8>(invHighD, invExactD));
 }

@@ -18,8 +18,14 @@ using namespace pyxcc::subsampled;
 namespace
 {
 
-auto ycbcr(const u8* src, int srcStep) { return c2LumaFirst(src, srcStep); }
-auto ycrcb(const u8* src, int srcStep) { return chromaExchanged(c2LumaFirst(src, srcStep)); }
+template <Order order = Order::ofMemory> auto ycbcr(const u8* src, int srcStep)
+{
+    return c2LumaFirst<order>(src, srcStep);
+}
+template <Order order = Order::ofMemory> auto ycrcb(const u8* src, int srcStep)
+{
+    return chromaExchanged(c2LumaFirst<order>(src, srcStep));
+}
 
 // The schools of the packed rows. Every column is converted, blocks of columns in the wide form.
 
@@ -57,7 +63,7 @@ PyxStatus PYXCC_CALL pyxiYCbCr422ToBGR_8u_C2C3R(const u8* src, int srcStep, u8* 
 PyxStatus PYXCC_CALL pyxiYCbCr422ToBGR_8u_C2C4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi, u8 aval)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return highD(roi, ycbcr(src, srcStep), reversed(c4(dst, dstStep, aval)));
+    return highD(roi, ycbcr<Order::ofWords>(src, srcStep), reversed(c4<Order::ofWords>(dst, dstStep, aval)));
 }
 
 PyxStatus PYXCC_CALL pyxiYCbCr422ToRGB_8u_C2C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
@@ -83,7 +89,7 @@ PyxStatus PYXCC_CALL pyxiYCrCb422ToRGB_8u_C2P3R(const u8* src, int srcStep, u8* 
 PyxStatus PYXCC_CALL pyxiYCbCr422ToRGB_8u_C2C4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi, u8 aval)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return eighthsC(roi, ycbcr(src, srcStep), c4(dst, dstStep, aval));
+    return eighthsC(roi, ycbcr<Order::ofWords>(src, srcStep), c4<Order::ofWords>(dst, dstStep, aval));
 }
 
 PyxStatus PYXCC_CALL pyxiYCrCb422ToBGR_8u_C2C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
@@ -95,7 +101,7 @@ PyxStatus PYXCC_CALL pyxiYCrCb422ToBGR_8u_C2C3R(const u8* src, int srcStep, u8* 
 PyxStatus PYXCC_CALL pyxiYCrCb422ToBGR_8u_C2C4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi, u8 aval)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return eighthsC(roi, ycrcb(src, srcStep), reversed(c4(dst, dstStep, aval)));
+    return eighthsC(roi, ycrcb<Order::ofWords>(src, srcStep), reversed(c4<Order::ofWords>(dst, dstStep, aval)));
 }
 
 PyxStatus PYXCC_CALL pyxiYCrCb422ToRGB_8u_C2C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
@@ -107,7 +113,7 @@ PyxStatus PYXCC_CALL pyxiYCrCb422ToRGB_8u_C2C3R(const u8* src, int srcStep, u8* 
 PyxStatus PYXCC_CALL pyxiYCrCb422ToRGB_8u_C2C4R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi, u8 aval)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return eighthsC(roi, ycrcb(src, srcStep), c4(dst, dstStep, aval));
+    return eighthsC(roi, ycrcb<Order::ofWords>(src, srcStep), c4<Order::ofWords>(dst, dstStep, aval));
 }
 
 /// A last odd column is left alone.

@@ -68,5 +68,6 @@ PyxStatus PYXCC_CALL pyxiCbYCr422ToBGR_709HDTV_8u_C2C4R(const u8* src, int srcSt
                                                         u8 aval)
 {
     if (const PyxStatus failure = firstFailure(notNull(src, dst), sizeAtLeast(roi, 1, 1))) return failure;
-    return eachRow(roi, c2ChromaFirst(src, srcStep), reversed(c4(dst, dstStep, aval)), hdtvRow);
+    return eachRow(roi, c2ChromaFirst<Order::ofWords>(src, srcStep), reversed(c4<Order::ofWords>(dst, dstStep, aval)),
+                   hdtvRow);
 }

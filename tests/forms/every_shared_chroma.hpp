@@ -7,8 +7,24 @@
 namespace forms
 {
 
-/// All 2^24 triples, as pairs of rows and as rows by themselves: 16 values of Cb, each shared by two columns of both
-/// rows; Y in one row counts up as the blocks do, in the other it counts down.
+/// 32 packed pixels with luma y, as one of three packings gives them.
+template <class Form, class Chroma>
+auto ofPackedPixels(const Form& form, int packing, int y, const Chroma& cb, const Chroma& cr)
+{
+    using namespace pyxcc::layouts;
+    const bool chromaFirst = packing == 0, exchanged = packing == 2;
+    std::array<u8, 64> pixels;
+    for (int i = 0; i < 32; ++i) {
+        pixels[2 * i + (chromaFirst ? 1 : 0)] = static_cast<u8>(y);
+        pixels[2 * i + (chromaFirst ? 0 : 1)] = (i % 2 == 1) != exchanged ? cr[i / 2] : cb[i / 2];
+    }
+    if (packing == 0) return apply(form, ChromaFirst<Order::ofMemory>::load(pixels.data()));
+    if (packing == 1) return apply(form, LumaFirst<Order::ofMemory>::load(pixels.data()));
+    return apply(form, ChromaExchanged<LumaFirst<Order::ofMemory>>::load(pixels.data()));
+}
+
+/// All 2^24 triples, as pairs of rows and as rows by themselves, in planes and packed: 16 values of Cb, each shared by
+/// two columns of both rows; Y in one row counts up as the blocks do, in the other it counts down.
 template <class Form> void expectSharedInstancesAgree(const Form& form)
 {
     using pyxcc::layouts::loadForPairs;
@@ -40,6 +56,7 @@ template <class Form> void expectSharedInstancesAgree(const Form& form)
                 ASSERT_NO_FATAL_FAILURE(expectRow(rows.b, 255 - y));
                 const pyxcc::layouts::ChromaOfPairs<U8> row{U8(y), chroma};
                 ASSERT_NO_FATAL_FAILURE(expectRow(apply(form, row), y));
+                ASSERT_NO_FATAL_FAILURE(expectRow(ofPackedPixels(form, (y + crOfAll) % 3, y, cb, cr), y));
             }
         }
     }

@@ -244,4 +244,22 @@ TEST(SharedChromaOfOnePixel, ChromaFirstTakesItsOwn)
     EXPECT_EQ(loadOnePixel(layouts::c2ChromaFirst(&onePixel[1], 0)), (std::array{50, 100, 100}));
 }
 
+TEST(PackedPixelsAsWords, GoToFourChannelsInTheOrderOfMemory)
+{
+    std::vector<u8> packed(8192), quadruples(8192); // with room for what rows hint at
+    for (int x = 0; x < 32; ++x) {
+        packed[2 * x] = static_cast<u8>(x + 1);
+        packed[2 * x + 1] = static_cast<u8>((x % 2 == 0 ? 101 : 151) + x / 2);
+    }
+    const auto pixels =
+        apply(Unchanged{}, layouts::c2LumaFirst<layouts::Order::ofWords>(packed.data(), 0).row(0).load(0));
+    layouts::c4<layouts::Order::ofWords>(quadruples.data(), 0, u8{9}).row(0).store(0, pixels);
+    for (int x = 0; x < 32; ++x) {
+        EXPECT_EQ(int{quadruples[4 * x]}, x + 1) << x;
+        EXPECT_EQ(int{quadruples[4 * x + 1]}, 101 + x / 2) << x;
+        EXPECT_EQ(int{quadruples[4 * x + 2]}, 151 + x / 2) << x;
+        EXPECT_EQ(int{quadruples[4 * x + 3]}, 9) << x;
+    }
+}
+
 } // namespace

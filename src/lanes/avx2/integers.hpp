@@ -124,9 +124,20 @@ PYXCC_INLINE S16 subSatS16(S16 x, S16 y) { return S16(_mm256_subs_epi16(x.v, y.v
 PYXCC_INLINE U16 addSatU16(U16 x, U16 y) { return U16(_mm256_adds_epu16(x.v, y.v)); }
 
 /// Bytes that were just widened to words. They are at hand 256 times as large too, since a byte can be put in the upper
-/// half of a word as cheaply as in the lower one; what a form does not use is never computed.
+/// half of a word as cheaply as in the lower one, and so is 128 times what they are below 16, the black of studio
+/// range; what a form does not use is never computed.
 struct Sample : S16 {
     U16 in256ths;
+    S16 belowBlack;
+
+    PYXCC_INLINE Sample(S16 words, U16 wordsIn256ths, S16 wordsBelowBlack)
+        : S16(words), in256ths(wordsIn256ths), belowBlack(wordsBelowBlack)
+    {
+    }
+    PYXCC_INLINE Sample(S16 words, U16 wordsIn256ths)
+        : Sample(words, wordsIn256ths, S16(16 << 7) - asS16(wordsIn256ths >> 1))
+    {
+    }
 
     /// 7 and 8 are the scales of the high-product forms.
     friend PYXCC_INLINE S16 operator<<(const Sample& x, int n)
@@ -137,25 +148,44 @@ struct Sample : S16 {
     }
 };
 
-/// Unsigned products serve where they come to the same: the weight takes up what 256 times are too large, and what they
-/// give for Zero is whole.
+/// What differs from Zero is taken 256 times where that comes to the same, since it is at hand: the weight takes up
+/// what is too large. So do unsigned products, if what they give for Zero is whole.
 template <int Zero, int Weight, int Bits = 7> PYXCC_INLINE S16 highShare(const Sample& x)
 {
     constexpr int excess = 1 << (8 - Bits);
     constexpr int atZero = (Zero << Bits) * Weight;
-    if constexpr (Weight > 0 && Weight % excess == 0 && atZero % 65536 == 0) {
+    if constexpr (Zero == 128) {
+        const S16 fromZero = lowered(x.in256ths);
+        return Weight % excess == 0 ? mulHighS16(fromZero, Weight / excess)
+                                    : mulHighS16(fromZero >> (8 - Bits), Weight);
+    } else if constexpr (Weight > 0 && Weight % excess == 0 && atZero % 65536 == 0) {
         return asS16(mulHighU16(x.in256ths, Weight / excess)) - atZero / 65536;
+    } else if constexpr (Zero == 16 && Bits == 7) {
+        return mulHighS16(x.belowBlack, -Weight);
     } else {
         return mulHighS16((x << Bits) - (Zero << Bits), Weight);
     }
 }
 
+namespace detail
+{
+
+/// 128 times what samples are below 16, by words of each beside 32.
+PYXCC_INLINE S16 belowBlack(__m256i pairs)
+{
+    return S16(_mm256_maddubs_epi16(pairs, _mm256_set1_epi16(64 * 256 + 128))); // 64 and -128
+}
+
+} // namespace detail
+
 /// The bytes as words, zero-extended, in the order that narrow() takes back: each 128-bit lane is widened by itself.
 PYXCC_INLINE Two<Sample> widen(U8 x)
 {
-    const __m256i zero = _mm256_setzero_si256();
-    return {{S16(_mm256_unpacklo_epi8(x.v, zero)), U16(_mm256_unpacklo_epi8(zero, x.v))},
-            {S16(_mm256_unpackhi_epi8(x.v, zero)), U16(_mm256_unpackhi_epi8(zero, x.v))}};
+    const __m256i zero = _mm256_setzero_si256(), beside = _mm256_set1_epi8(32);
+    return {{S16(_mm256_unpacklo_epi8(x.v, zero)), U16(_mm256_unpacklo_epi8(zero, x.v)),
+             detail::belowBlack(_mm256_unpacklo_epi8(x.v, beside))},
+            {S16(_mm256_unpackhi_epi8(x.v, zero)), U16(_mm256_unpackhi_epi8(zero, x.v)),
+             detail::belowBlack(_mm256_unpackhi_epi8(x.v, beside))}};
 }
 
 PYXCC_INLINE U8 narrow(Byte low, Byte high) { return U8(_mm256_packus_epi16(low.v, high.v)); }

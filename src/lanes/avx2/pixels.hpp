@@ -36,6 +36,12 @@ template <int Lower, int Upper> PYXCC_INLINE WordPairs mulHighS16(WordPairs x)
     return WordPairs(_mm256_mulhi_epi16(x.v, WordPairs(Lower, Upper).v));
 }
 
+/// Rounded products of both words, of which 15 bits are dropped.
+template <int Lower, int Upper> PYXCC_INLINE WordPairs mulRound15(WordPairs x)
+{
+    return WordPairs(_mm256_mulhrs_epi16(x.v, WordPairs(Lower, Upper).v));
+}
+
 /// The products of both words, added up.
 template <int Lower, int Upper> PYXCC_INLINE S32 sumOfProducts(WordPairs x)
 {

@@ -2,6 +2,7 @@
 // of them share.
 #pragma once
 
+#include "lanes/avx2/pixels.hpp"
 #include "layouts/avx2/turns.hpp"
 
 namespace pyxcc::layouts
@@ -180,20 +181,35 @@ PYXCC_INLINE Two<wide::U8> loadAlternating(const u8* p)
     return dealt<1>(wide::U8(detail::loadWhole(p)), wide::U8(detail::loadWhole(p + 32)));
 }
 
+namespace detail
+{
+
+/// 128 times what the bytes at `Place` of each word are below 16.
+template <int Place> PYXCC_INLINE wide::S16 belowBlack(wide::U8 x)
+{
+    const __m256i times = _mm256_set1_epi16(static_cast<short>(Place == 0 ? 128 : 128 * 256)); // -128
+    return wide::S16(_mm256_maddubs_epi16(x.v, times)) + (16 << 7);
+}
+
+} // namespace detail
+
 /// The even bytes as words, and the odd ones.
 PYXCC_INLINE wide::Sample lowBytes(wide::U8 x)
 {
-    return {wide::S16(_mm256_and_si256(x.v, _mm256_set1_epi16(255))), wide::U16(_mm256_slli_epi16(x.v, 8))};
+    return {wide::S16(_mm256_and_si256(x.v, _mm256_set1_epi16(255))), wide::U16(_mm256_slli_epi16(x.v, 8)),
+            detail::belowBlack<0>(x)};
 }
 PYXCC_INLINE wide::Sample highBytes(wide::U8 x)
 {
-    return {wide::S16(_mm256_srli_epi16(x.v, 8)), wide::U16(_mm256_andnot_si256(_mm256_set1_epi16(255), x.v))};
+    return {wide::S16(_mm256_srli_epi16(x.v, 8)), wide::U16(_mm256_andnot_si256(_mm256_set1_epi16(255), x.v)),
+            detail::belowBlack<1>(x)};
 }
 
 /// Reads 32 pixels of two bytes. Their even bytes, or their odd ones, come as those of a block do that is widened: the
-/// first and the third quarter, the second and the fourth.
-PYXCC_INLINE Two<wide::U8> loadForWidening(const u8* p)
+/// first and the third quarter, the second and the fourth. Or they come as they are.
+template <Order order> PYXCC_INLINE Two<wide::U8> loadForWidening(const u8* p)
 {
+    if constexpr (order == Order::ofWords) return {wide::U8(detail::loadWhole(p)), wide::U8(detail::loadWhole(p + 32))};
     return {wide::U8(detail::lanesFrom(p, p + 32)), wide::U8(detail::lanesFrom(p + 16, p + 48))};
 }
 
@@ -225,6 +241,86 @@ template <int First> PYXCC_INLINE Two<wide::Sample> chromaOfPairs(const Two<wide
     const Two<wide::U16> words = detail::everyOther<First, 0>(pixels);
     const Two<wide::U16> in256ths = detail::everyOther<First, 1>(pixels);
     return {{asS16(words.a), in256ths.a}, {asS16(words.b), in256ths.b}};
+}
+
+/// 16 pixels of two bytes, one of which is chroma: of one component at byte `First` of every four and of the other two
+/// behind, Cr before Cb if `Exchanged`.
+template <int First, bool Exchanged> struct ChromaInPlace {
+    wide::U8 pixels;
+};
+
+/// A word of each component for two pixels, in the order of the bytes.
+template <bool Exchanged> struct ChromaWords {
+    wide::WordPairs v;
+
+    friend PYXCC_INLINE ChromaWords operator-(const ChromaWords& x, const Two<int>& k)
+    {
+        return {x.v - (Exchanged ? Two{k.b, k.a} : k)};
+    }
+};
+
+/// Chroma from 128, `Times` times as large.
+template <int Times, int First, bool Exchanged>
+PYXCC_INLINE ChromaWords<Exchanged> chromaFrom128(const ChromaInPlace<First, Exchanged>& chroma)
+{
+    static_assert(Times >= 1 && Times <= 255);
+    const __m256i from128 = _mm256_xor_si256(chroma.pixels.v, _mm256_set1_epi8(-128));
+    const __m256i times = _mm256_set1_epi16(static_cast<short>(Times << 8 * First));
+    return {wide::WordPairs(_mm256_maddubs_epi16(times, from128))};
+}
+
+/// Chroma as it is, `Times` times as large.
+template <int Times, int First, bool Exchanged>
+PYXCC_INLINE ChromaWords<Exchanged> chromaFrom0(const ChromaInPlace<First, Exchanged>& chroma)
+{
+    static_assert(Times >= 1 && Times <= 127);
+    return {wide::WordPairs(_mm256_maddubs_epi16(chroma.pixels.v, _mm256_set1_epi16(Times << 8 * First)))};
+}
+
+template <int Cb, int Cr, bool Exchanged>
+PYXCC_INLINE ChromaWords<Exchanged> mulHighS16(const ChromaWords<Exchanged>& x)
+{
+    return {wide::mulHighS16 < Exchanged ? Cr : Cb, Exchanged ? Cb : Cr > (x.v)};
+}
+template <int Cb, int Cr, bool Exchanged>
+PYXCC_INLINE ChromaWords<Exchanged> mulRound15(const ChromaWords<Exchanged>& x)
+{
+    return {wide::mulRound15 < Exchanged ? Cr : Cb, Exchanged ? Cb : Cr > (x.v)};
+}
+template <bool Exchanged> PYXCC_INLINE ChromaWords<Exchanged> operator>>(const ChromaWords<Exchanged>& x, int n)
+{
+    return {wide::WordPairs(_mm256_srai_epi16(x.v.v, n))};
+}
+
+template <int Shift, bool Exchanged> PYXCC_INLINE ChromaWords<Exchanged> roundedShift(const ChromaWords<Exchanged>& x)
+{
+    return mulRound15<1 << (15 - Shift), 1 << (15 - Shift)>(x);
+}
+
+namespace detail
+{
+
+/// Bytes of every four of a lane.
+template <int A, int B, int C, int D>
+constexpr Places placesInFours = placesOfBytes<1>([](int i) {
+    return i / 4 * 4 + std::array{A, B, C, D}[static_cast<std::size_t>(i % 4)];
+});
+
+} // namespace detail
+
+/// A component, or the sum of both, as words of each of the pixels.
+template <bool Exchanged> PYXCC_INLINE wide::S16 cbOfPixels(const ChromaWords<Exchanged>& x)
+{
+    constexpr int at = Exchanged ? 2 : 0;
+    return wide::S16(detail::shuffle(x.v.v, detail::placesInFours<at, at + 1, at, at + 1>));
+}
+template <bool Exchanged> PYXCC_INLINE wide::S16 crOfPixels(const ChromaWords<Exchanged>& x)
+{
+    return cbOfPixels(ChromaWords<!Exchanged>{x.v});
+}
+template <bool Exchanged> PYXCC_INLINE wide::S16 sumOfPixels(const ChromaWords<Exchanged>& x)
+{
+    return wide::S16(x.v.v) + wide::S16(detail::shuffle(x.v.v, detail::placesInFours<2, 3, 0, 1>));
 }
 
 /// Writes 64 bytes, the even ones from `even`.

@@ -13,8 +13,9 @@ namespace pyxcc::layouts
 template <class Samples> inline constexpr int sampleBytes = 32 / Samples::count;
 
 /// The order of a block's pixels in a register: that of memory, or whatever is the least work for pixels of four
-/// samples, which never need to cross the halves of a register. The stores take either back.
-enum class Order { ofMemory, any };
+/// samples, which never need to cross the halves of a register; or that of two registers of words that are narrowed,
+/// for words in the order of memory. The stores take each back.
+enum class Order { ofMemory, any, ofWords };
 
 /// Stores go to the cache, or past it at addresses that are multiples of 32.
 enum class Stores { cached, streamed };
@@ -313,7 +314,14 @@ template <Order order, class Samples> PYXCC_INLINE Four<wide::U8> interleaveInOr
 template <Order order = Order::ofMemory, Stores stores = Stores::cached, class Samples>
 PYXCC_INLINE void storeQuadruples(u8* p, const Four<Samples>& pixels)
 {
-    if constexpr (sampleBytes<Samples> == 1 && order == Order::ofMemory && stores == Stores::cached) {
+    if constexpr (order == Order::ofWords) {
+        static_assert(sampleBytes<Samples> == 1 && stores == Stores::cached);
+        const Four<wide::U8> x = detail::interleave(pixels);
+        detail::storeLanes<2>(p, 0, x.a.v);
+        detail::storeLanes<2>(p, 1, x.b.v);
+        detail::storeLanes<2>(p + 64, 0, x.c.v);
+        detail::storeLanes<2>(p + 64, 1, x.d.v);
+    } else if constexpr (sampleBytes<Samples> == 1 && order == Order::ofMemory && stores == Stores::cached) {
         const Four<wide::U8> x = detail::interleave(pixels);
         detail::storeLanes<4>(p, 0, x.a.v);
         detail::storeLanes<4>(p, 1, x.b.v);
