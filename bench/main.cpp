@@ -63,7 +63,7 @@ void registerOne(const catalog::Export& entry, const catalog::Variant* variant, 
     for (int i = 0; variant && i < entry.parameterCount; ++i) {
         const catalog::Parameter& parameter = entry.traits.parameters[i];
         if ((*variant)[i] == parameter.standard[0]) continue;
-        name += name.find('=') == name.npos ? '/' : ',';
+        name += name.find('=') == std::string::npos ? '/' : ',';
         name += std::string(parameter.name) + '=' + std::to_string(std::lround((*variant)[i]));
     }
     name += '/' + std::to_string(roi.width) + 'x' + std::to_string(roi.height);

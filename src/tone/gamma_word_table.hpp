@@ -51,12 +51,12 @@ template <class Curve> struct GammaOfRun : frame::OnSamples {
 template <class Curve> void fillTable(u16* table)
 {
     std::iota(table, table + wordTableSize, u16{0});
-    const auto take = [table](const auto& form, int from, int to) {
-        EachSample{form}(InPlane{}, {to - from, 1}, table + from, 1, table + from, 1);
+    const auto take = [table]<class Form>(const Form& form, int from, int to) {
+        EachSample<Form>{form}(InPlane{}, {to - from, 1}, table + from, 1, table + from, 1);
     };
     int from = Curve::firstRun;
     take(GammaOfWords<Curve>{}, 0, from);
-    for (int octave = std::bit_floor(static_cast<unsigned>(from)); octave < wordTableSize; octave *= 2) {
+    for (int octave = static_cast<int>(std::bit_floor(static_cast<u32>(from))); octave < wordTableSize; octave *= 2) {
         for (const int run = octave / 32; from < 2 * octave; from += run)
             take(GammaOfRun<Curve>(from + run / 2), from, from + run);
     }
