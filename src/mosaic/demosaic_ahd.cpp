@@ -47,7 +47,7 @@ template <class T> class Stretch
 {
 public:
     /// Three columns in front of those that are converted and three behind them.
-    static constexpr int planeColumns = 256, columns = planeColumns - 6;
+    static constexpr int planeColumns = 384 / static_cast<int>(sizeof(T)), columns = planeColumns - 6;
 
     Stretch(const Work<T>& work, const Block& block, s32 x)
         : work_(work), block_(block), x_(x), width_(std::min(columns, block.x + block.width - x)),
