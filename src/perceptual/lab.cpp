@@ -26,6 +26,11 @@ template <class Depth, int Block> auto toRgb()
     return wideThenTail<Block>(LabToRgb<Depth, FusedSums>{}, LabToRgb<Depth, PlainSums>{});
 }
 
+template <class Depth, int Block> auto toBgr()
+{
+    return wideThenTail<Block>(LabToBgr<Depth, FusedSums>{}, LabToBgr<Depth, PlainSums>{});
+}
+
 } // namespace
 
 PyxStatus PYXCC_CALL pyxiBGRToLab_32f_C3R(const f32* src, int srcStep, f32* dst, int dstStep, RoiSize roi)
@@ -55,7 +60,7 @@ PyxStatus PYXCC_CALL pyxiLabToBGR_32f_C3R(const f32* src, int srcStep, f32* dst,
 
 PyxStatus PYXCC_CALL pyxiLabToBGR_8u_C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
-    return convert(src, dst, roi, c3Eights(src, srcStep), reversed(c3Eights(dst, dstStep)), toRgb<OfLabBytes, 8>());
+    return convert(src, dst, roi, c3ForFactors(src, srcStep), c3ForFactors(dst, dstStep), toBgr<OfLabBytes, 8>());
 }
 
 PyxStatus PYXCC_CALL pyxiLabToRGB_32f_C3R(const f32* src, int srcStep, f32* dst, int dstStep, RoiSize roi)
@@ -65,7 +70,7 @@ PyxStatus PYXCC_CALL pyxiLabToRGB_32f_C3R(const f32* src, int srcStep, f32* dst,
 
 PyxStatus PYXCC_CALL pyxiLabToRGB_8u_C3R(const u8* src, int srcStep, u8* dst, int dstStep, RoiSize roi)
 {
-    return convert(src, dst, roi, c3Eights(src, srcStep), c3Eights(dst, dstStep), toRgb<OfLabBytes, 8>());
+    return convert(src, dst, roi, c3ForFactors(src, srcStep), c3ForFactors(dst, dstStep), toRgb<OfLabBytes, 8>());
 }
 
 PyxStatus PYXCC_CALL pyxiRGBToLab_32f_C3R(const f32* src, int srcStep, f32* dst, int dstStep, RoiSize roi)

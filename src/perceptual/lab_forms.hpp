@@ -202,4 +202,21 @@ private:
     template <class F32> static PYXCC_INLINE F32 cube(const F32& x) { return (x * x) * x; }
 };
 
+/// Blue first, for layouts that have no order of their own.
+template <class Depth, class Sums> struct LabToBgr : frame::OnFloats {
+    template <class F32> PYXCC_INLINE auto operator()(const F32& L, const F32& a, const F32& b) const
+    {
+        const auto [R, G, B] = LabToRgb<Depth, Sums>{}(L, a, b);
+        return Three{B, G, R};
+    }
+};
+
+/// Blocks of sixteen pixels, two registers a channel.
+template <std::derived_from<frame::OnFloats> Form>
+PYXCC_INLINE auto apply(const Form& form, const Two<Three<wide::F32>>& pixels)
+{
+    const auto& [x, y] = pixels;
+    return Two{form(x.a, x.b, x.c), form(y.a, y.b, y.c)};
+}
+
 } // namespace pyxcc::perceptual

@@ -83,22 +83,39 @@ struct RefinedReciprocal {
 
 /// Three channels take the reciprocals as they come and round to nearest, four refine them and are cut. Of black, L is
 /// 0, and so is Y with all that comes of it: its u and v, which may be divided by anything else, do not show. 13 L of
-/// other bytes is above 5.
+/// other bytes is above 5. The reciprocals are what there is to wait for.
 template <class Reciprocal, class Conversion> struct LuvToRgbOfBytes : frame::OnFloats {
-    template <class F32> PYXCC_INLINE auto operator()(const F32& L, const F32& U, const F32& V) const
+    static constexpr bool inTwoSteps = true;
+
+    /// uu, Y, and 1 over vv.
+    template <class F32> struct Begun {
+        F32 uu, Y, x;
+    };
+
+    template <class F32> PYXCC_INLINE Begun<F32> begin(const F32& L, const F32& U, const F32& V) const
     {
         constexpr Reciprocal reciprocal;
-        constexpr Conversion conversion;
         const F32 Lp = L * 0.39215687f, f = fused(F32(0.39215687f), L, F32(16.0f)) * 0.00862069f;
         const F32 us = fused(F32(1.3882353f), U, F32(-134.0f)), vs = fused(V, F32(1.027451f), F32(-140.0f));
         const F32 rq = reciprocal(greater(Lp * 13.0f, F32(1.0f)));
         const F32 uu = fused(rq, us, F32(un)), x = reciprocal(offZero(fused(vs, rq, F32(vn))));
-        const F32 Y = whereLess(Lp, F32(luvLineEnd), Lp * 0.001107052f, cubed(f));
+        return {uu, whereLess(Lp, F32(luvLineEnd), Lp * 0.001107052f, cubed(f)), x};
+    }
+
+    template <class F32> PYXCC_INLINE auto end(const Begun<F32>& begun) const
+    {
+        constexpr Conversion conversion;
+        const auto& [uu, Y, x] = begun;
         const F32 w = fused(F32(3.0f), x, F32(-5.0f));
         const F32 X = uu * ((x * Y) * 2.25f);
         const F32 Z = fused(-X, F32(0.33333334f), w * Y);
         const auto [R, G, B] = multiplied<FusedSums>(rgbOfXyz, X, Y, Z);
         return Three{conversion(R * 255.0f), conversion(G * 255.0f), conversion(B * 255.0f)};
+    }
+
+    template <class F32> PYXCC_INLINE auto operator()(const F32& L, const F32& U, const F32& V) const
+    {
+        return end(begin(L, U, V));
     }
 };
 
