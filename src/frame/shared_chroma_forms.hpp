@@ -67,8 +67,8 @@ concept OnPackedChroma = requires(layouts::ChromaInPlace<0, false> chroma)
 template <OnPackedChroma Form, int First, bool Exchanged>
 PYXCC_INLINE auto apply(const Form&, const layouts::PixelsInTurn<First, Exchanged>& pixels)
 {
-    return narrowAll(Form::add(pixels.luma.a, Form::sharesInPlace(pixels.inPlace.a)),
-                     Form::add(pixels.luma.b, Form::sharesInPlace(pixels.inPlace.b)));
+    return narrowAll(Form::addInPlace(pixels.luma.a, Form::sharesInPlace(pixels.inPlace.a)),
+                     Form::addInPlace(pixels.luma.b, Form::sharesInPlace(pixels.inPlace.b)));
 }
 
 /// One row adds it to its even columns and to its odd ones, which saves laying it beside them.

@@ -52,6 +52,7 @@ enum class Rest { lumaOnly, withChroma };
 template <int Columns, class Byte, Order Within = Order::ofMemory, Rest rest = Rest::lumaOnly> struct ChromaPlanesRow {
     static constexpr int columns = Columns;
     static constexpr Order order = Within;
+    static constexpr bool loadedAtOnce = Columns == 2;
     Byte *a, *b;
 
     PYXCC_INLINE Two<wide::Sample> load(int x) const
@@ -97,6 +98,7 @@ private:
 template <class Byte, bool Exchanged, Order Within = Order::ofMemory> struct ChromaPairsRow {
     static constexpr int columns = 2;
     static constexpr Order order = Within;
+    static constexpr bool loadedAtOnce = true;
     SampleRow<wide::U8, Byte> pairs;
 
     PYXCC_INLINE Two<wide::Sample> load(int x) const { return apart(pairs.load(x)); }
@@ -120,7 +122,7 @@ private:
 /// One row of luma, or two, and the row of chroma that goes with it.
 template <class LumaRow, class ChromaRow> struct SharedChromaRow {
     static constexpr int block = LumaRow::block;
-    static constexpr bool loadedAtOnce = true;
+    static constexpr bool loadedAtOnce = loadsAtOnce<ChromaRow>;
     LumaRow luma;
     ChromaRow chroma;
 

@@ -6,6 +6,7 @@
 #pragma once
 
 #include "frame/forms.hpp"
+#include "lanes/avx2/bytes_by_turns.hpp"
 #include "lanes/lanes.hpp"
 
 #include <bit>
@@ -78,6 +79,17 @@ template <Weights k, int Addend> struct LumaRound : frame::OnWords {
     {
         const auto y = mulRound15(R << 7, k.r) + mulRound15(G << 7, k.g) + mulRound15(B << 7, k.b) + Addend;
         return sat8(y >> 6);
+    }
+
+    /// Twice the weights make up for half the scale, which is at hand.
+    static PYXCC_INLINE wide::U8 ofBytes(wide::U8 R, wide::U8 G, wide::U8 B)
+    {
+        static_assert(k.r > 0 && k.g > 0 && k.b > 0 && k.r + k.g + k.b + Addend < 16384); // so that a byte it is
+        const auto r = wide::timesByTurns<64>(R), g = wide::timesByTurns<64>(G), b = wide::timesByTurns<64>(B);
+        const auto y = [](const auto& x, const auto& y, const auto& z) PYXCC_INLINE_LAMBDA {
+            return mulRound15(x, 2 * k.r) + mulRound15(y, 2 * k.g) + mulRound15(z, 2 * k.b) + Addend;
+        };
+        return wide::bytesByTurns<6>(y(r.a, g.a, b.a), y(r.b, g.b, b.b));
     }
 };
 

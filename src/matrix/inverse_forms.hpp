@@ -35,6 +35,26 @@ constexpr Three<int> from128(InverseWeights k, int addend)
 /// Luma in the scale of the shares.
 template <int Zero, int Weight> struct HighLuma {
     template <class Word> static PYXCC_INLINE auto scaled(const Word& Y) { return highShare<Zero, Weight>(Y); }
+
+    /// How much less than black luma is to be counted from for its product to be more by `Addend`; 0 if there is none.
+    template <int Addend>
+    static constexpr int lessBlack = [] {
+        for (int less = 1; less < 128; ++less) {
+            bool same = true;
+            for (int y = 0; y < 256 && same; ++y) {
+                const int fromZero = 128 * (y - Zero);
+                same = (fromZero + less) * Weight >> 16 == (fromZero * Weight >> 16) + Addend;
+            }
+            if (same) return less;
+        }
+        return 0;
+    }();
+
+    /// The share and `Addend`, at no more cost where black is counted off by itself.
+    template <int Addend, class Word> static PYXCC_INLINE auto scaledPlus(const Word& Y)
+    {
+        return mulHighS16(Y.belowBlack - lessBlack<Addend>, -Weight);
+    }
 };
 
 /// Weights of the high products; those of G are taken as the form below has them, added or taken off.
@@ -57,6 +77,27 @@ template <HighWeights k, class Chroma> PYXCC_INLINE auto products(const Chroma& 
 {
     return SharesInPlace{mulHighS16<k.cbToB, k.crToR>(x), mulHighS16<k.cbToG, k.crToG>(x)};
 }
+
+/// A product of chroma that is rounded as it is made: how many times as large chroma is to be, and the weight.
+struct RoundedProduct {
+    int times, weight;
+};
+
+/// The one that gives a share in steps of 1 << Shift, rounded, at once; a weight for G makes up for `times` being less
+/// than 128. Zero if there is none.
+template <int Weight, int WeightOfG, int Shift>
+constexpr RoundedProduct roundedProduct = [] {
+    for (int times = 64; times >= 4; times /= 2) {
+        const int weight = (Weight * 64 + (times << Shift) / 2) / (times << Shift);
+        bool same = WeightOfG * (128 / times) <= 32767;
+        for (int x = -128; x < 128 && same; ++x) {
+            const int share = x * 128 * Weight >> 16;
+            same = (share + (1 << Shift) / 2) >> Shift == (x * times * weight + 16384) >> 15;
+        }
+        if (same) return RoundedProduct{times, weight};
+    }
+    return RoundedProduct{0, 0};
+}();
 
 } // namespace detail
 
@@ -85,6 +126,21 @@ template <HighWeights k> struct ChromaTakenOff {
     template <class Chroma> static PYXCC_INLINE auto sharesInPlace(const Chroma& chroma)
     {
         return detail::products<k>(chromaFrom128<128>(chroma));
+    }
+
+    template <int Shift>
+    static constexpr Two<detail::RoundedProduct> roundedBAndR = {detail::roundedProduct<k.cbToB, k.cbToG, Shift>,
+                                                                 detail::roundedProduct<k.crToR, k.crToG, Shift>};
+    template <int Shift>
+    static constexpr bool roundsBAndR = roundedBAndR<Shift>.a.times > 0 && roundedBAndR<Shift>.b.times > 0;
+
+    /// The same with R and B in steps of 1 << Shift, rounded.
+    template <int Shift, class Chroma> static PYXCC_INLINE auto roundedInPlace(const Chroma& chroma)
+    {
+        constexpr auto cb = roundedBAndR<Shift>.a, cr = roundedBAndR<Shift>.b;
+        const auto scaled = chromaFrom128<cb.times, cr.times>(chroma);
+        return detail::SharesInPlace{mulRound15<cb.weight, cr.weight>(scaled),
+                                     mulHighS16<k.cbToG*(128 / cb.times), k.crToG*(128 / cr.times)>(scaled)};
     }
 
     template <class Word> static PYXCC_INLINE auto shares(const Word& Cb, const Word& Cr)
@@ -158,6 +214,19 @@ template <class Luma, class Chroma, int Rounding, int Shift> struct InvHigh : fr
         return add(Y, Chroma::shares(Cb, Cr));
     }
 
+    /// Packed pixels: what is added for rounding comes with luma where it can.
+    template <class Word, class Share> static PYXCC_INLINE auto addInPlace(const Word& Y, const Three<Share>& chroma)
+    {
+        if constexpr (Rounding > 0 && Luma::template lessBlack < Rounding >> 0) {
+            const auto y = Luma::template scaledPlus<Rounding>(Y);
+            const auto inSteps = [](const auto& sum) PYXCC_INLINE_LAMBDA { return sat8(sum >> Shift); };
+            return Three{inSteps(y + chroma.a), inSteps(Chroma::takesOffG ? y - chroma.b : y + chroma.b),
+                         inSteps(y + chroma.c)};
+        } else {
+            return add(Y, chroma);
+        }
+    }
+
     template <class Packed> static PYXCC_INLINE auto sharesInPlace(const Packed& chroma) requires requires
     {
         Chroma::sharesInPlace(chroma);
@@ -188,14 +257,18 @@ template <class Chroma, int Rounding, int Shift> struct InvFullRange : frame::Ad
         Chroma::sharesInPlace(chroma);
     }
     {
-        const auto share = Chroma::sharesInPlace(chroma);
-        const auto bAndR = detail::inSteps<Rounding, Shift>(share.bAndR);
-        return Three{crOfPixels(bAndR), ofG(sumOfPixels(share.g)), cbOfPixels(bAndR)};
+        const auto share = inSteps(chroma);
+        return Three{crOfPixels(share.bAndR), ofG(sumOfPixels(share.g)), cbOfPixels(share.bAndR)};
     }
 
     template <class Word, class Share> static PYXCC_INLINE auto add(const Word& Y, const Three<Share>& chroma)
     {
         return Three{sat8(Y + chroma.a), sat8(Y + chroma.b), sat8(Y + chroma.c)};
+    }
+
+    template <class Word, class Share> static PYXCC_INLINE auto addInPlace(const Word& Y, const Three<Share>& chroma)
+    {
+        return add(Y, chroma);
     }
 
     template <class Word> PYXCC_INLINE auto operator()(const Word& Y, const Word& Cb, const Word& Cr) const
@@ -204,11 +277,24 @@ template <class Chroma, int Rounding, int Shift> struct InvFullRange : frame::Ad
     }
 
 private:
+    static constexpr bool roundsToNearest = Shift > 0 && Rounding == (1 << Shift) / 2;
+
+    /// R and B.
+    template <class Packed> static PYXCC_INLINE auto inSteps(const Packed& chroma)
+    {
+        if constexpr (roundsToNearest && requires { requires Chroma::template roundsBAndR<Shift>; }) {
+            return Chroma::template roundedInPlace<Shift>(chroma);
+        } else {
+            const auto share = Chroma::sharesInPlace(chroma);
+            return detail::SharesInPlace{detail::inSteps<Rounding, Shift>(share.bAndR), share.g};
+        }
+    }
+
     template <class Share> static PYXCC_INLINE auto ofG(const Share& share)
     {
         if constexpr (!Chroma::takesOffG) {
             return detail::inSteps<Rounding, Shift>(share);
-        } else if constexpr (Shift > 0 && Rounding == (1 << Shift) / 2) {
+        } else if constexpr (roundsToNearest) {
             return mulRound15(share, -(1 << (15 - Shift))); // which takes off as it rounds
         } else {
             return detail::inSteps<Rounding, Shift>(0 - share);

@@ -259,13 +259,14 @@ template <bool Exchanged> struct ChromaWords {
     }
 };
 
-/// Chroma from 128, `Times` times as large.
-template <int Times, int First, bool Exchanged>
+/// Chroma from 128, so many times as large as it is.
+template <int TimesCb, int TimesCr = TimesCb, int First, bool Exchanged>
 PYXCC_INLINE ChromaWords<Exchanged> chromaFrom128(const ChromaInPlace<First, Exchanged>& chroma)
 {
-    static_assert(Times >= 1 && Times <= 255);
+    static_assert(TimesCb >= 1 && TimesCb <= 255 && TimesCr >= 1 && TimesCr <= 255);
+    constexpr int inOrder = Exchanged ? TimesCr | TimesCb << 16 : TimesCb | TimesCr << 16;
+    const __m256i times = _mm256_set1_epi32(static_cast<int>(static_cast<u32>(inOrder) << 8 * First));
     const __m256i from128 = _mm256_xor_si256(chroma.pixels.v, _mm256_set1_epi8(-128));
-    const __m256i times = _mm256_set1_epi16(static_cast<short>(Times << 8 * First));
     return {wide::WordPairs(_mm256_maddubs_epi16(times, from128))};
 }
 
