@@ -29,13 +29,7 @@ template <class F32> PYXCC_INLINE F32 powerOfAThird(const RootStart<F32>& start,
 struct RgbToLuvByPower : frame::OnFloats {
     static constexpr bool inTwoSteps = true;
 
-    template <class F32> struct Begun {
-        F32 Y;
-        RootStart<F32> start;
-        LuvChroma<F32> chroma;
-    };
-
-    template <class F32> PYXCC_INLINE Begun<F32> begin(const F32& R, const F32& G, const F32& B) const
+    template <class F32> PYXCC_INLINE BegunLuv<F32> begin(const F32& R, const F32& G, const F32& B) const
     {
         const F32 full = 255.0f, zero = 0.0f;
         const F32 X = FusedSums::weighted(xOfRgb, R, G, B) / full;
@@ -46,13 +40,12 @@ struct RgbToLuvByPower : frame::OnFloats {
         return {Y, rootStartWithin(labCubeRootTable, trunc(Y * 127.998046875f), Y), {up - un, vp - vn}};
     }
 
-    template <class F32> PYXCC_INLINE auto end(const Begun<F32>& begun) const
+    template <class F32> PYXCC_INLINE auto end(const BegunLuv<F32>& begun) const
     {
-        const F32& Y = begun.Y;
-        const F32 L =
-            whereLess(F32(luvLimit), Y, fused(powerOfAThird(begun.start, Y), F32(116.0f), F32(-16.0f)), Y * 903.3f);
+        const auto& [Y, start, chroma] = begun;
+        const F32 L = whereLess(F32(luvLimit), Y, fused(powerOfAThird(start, Y), F32(116.0f), F32(-16.0f)), Y * 903.3f);
         const F32 full = 255.0f, scale = L * 13.0f;
-        const F32 u = fused(begun.chroma.u, scale, F32(134.0f)), v = fused(begun.chroma.v, scale, F32(140.0f));
+        const F32 u = fused(chroma.u, scale, F32(134.0f)), v = fused(chroma.v, scale, F32(140.0f));
         return Three{trunc((full * L) / F32(100.0f)), trunc((full * u) / F32(354.0f) + 0.5f),
                      trunc((v * full) / F32(262.0f) + 0.5f)};
     }

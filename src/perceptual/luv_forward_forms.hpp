@@ -22,6 +22,13 @@ template <class F32> struct LuvChroma {
     F32 u, v;
 };
 
+/// A first step: Y, where its root starts from, and chroma.
+template <class F32> struct BegunLuv {
+    F32 Y;
+    RootStart<F32> start;
+    LuvChroma<F32> chroma;
+};
+
 template <class F32> PYXCC_INLINE F32 luvDenominator(const F32& X, const F32& Y, const F32& Z)
 {
     return fused(Y, F32(15.0f), fused(F32(3.0f), Z, X));
@@ -74,19 +81,13 @@ struct RgbToLuvOfFloats : frame::OnFloats {
 
     constexpr explicit RgbToLuvOfFloats(f32 rows) : rowsToOne(rows) {}
 
-    template <class F32> struct Begun {
-        F32 Y;
-        RootStart<F32> start;
-        LuvChroma<F32> chroma;
-    };
-
-    template <class F32> PYXCC_INLINE Begun<F32> begin(const F32& R, const F32& G, const F32& B) const
+    template <class F32> PYXCC_INLINE BegunLuv<F32> begin(const F32& R, const F32& G, const F32& B) const
     {
         const auto [X, Y, Z] = multiplied<FusedSums>(xyzOfRgb, R, G, B);
         return {Y, rootStart(luvCubeRootTable, trunc(Y * rowsToOne), Y), luvChromaInBlocks(X, Y, Z)};
     }
 
-    template <class F32> PYXCC_INLINE Three<F32> end(const Begun<F32>& begun) const
+    template <class F32> PYXCC_INLINE Three<F32> end(const BegunLuv<F32>& begun) const
     {
         const auto& [Y, start, chroma] = begun;
         const F32 root = rootByEightTerms(start, luvLastTerms);
@@ -137,11 +138,11 @@ struct RgbToLuvOfBytes : frame::OnFloats {
     template <class F32> PYXCC_INLINE auto operator()(const F32& R, const F32& G, const F32& B) const
     {
         constexpr f64 unit = 0.003921569f, L1 = 2.55f * oneLevel, u1 = 0.720339f * oneLevel, v1 = 0.9732825f * oneLevel;
-        // y is raised, the denominator D such that (y - black) / D is 9 Y over it in levels of v, and x to match.
+        // y is raised, the denominator D such that (y - black) / D is 9 Y over it in levels of v, and x to match. Black
+        // is divided by something else than 0.
         constexpr f64 ofD = unit * raisedScale / (9 * 13 * v1), ofX = 4 * 13 * u1 * ofD;
         static constexpr WeightsAndMore kx = scaledWeights(xOfRgb, ofX), ky = raisedWeights(yOfRgb, unit),
-                                        kd = scaledWeights(luvDenominatorOfRgb, ofD,
-                                                           1e-30f); // black is divided by something
+                                        kd = scaledWeights(luvDenominatorOfRgb, ofD, 1e-30f);
         const F32 x = weighted(kx, R, G, B), y = weighted(ky, R, G, B), e = refinedByFused(weighted(kd, R, G, B));
         constexpr f32 whiteU = -un * 13 * u1, whiteV = -vn * 13 * v1;
         const F32 L = lookUp(lightnessLines, y);
@@ -166,25 +167,19 @@ template <class F32> PYXCC_INLINE Three<F32> scaledToWords(const F32& L, const F
 struct RgbToLuvOfWords : frame::OnFloats {
     static constexpr bool inTwoSteps = true;
 
-    template <class F32> struct Begun {
-        F32 Y;
-        RootStart<F32> start;
-        LuvChroma<F32> chroma;
-    };
-
-    template <class F32> PYXCC_INLINE Begun<F32> begin(const F32& R, const F32& G, const F32& B) const
+    template <class F32> PYXCC_INLINE BegunLuv<F32> begin(const F32& R, const F32& G, const F32& B) const
     {
         const auto [X, Y, Z] = multiplied<FusedSums>(xyzOfRgb, R, G, B);
         return {Y, rootStartWithin(luvCubeRootTable, trunc(Y) >> 9, Y * wordUnit), luvChromaOfSamples(X, Y, Z)};
     }
 
-    template <class F32> PYXCC_INLINE auto end(const Begun<F32>& begun) const
+    template <class F32> PYXCC_INLINE auto end(const BegunLuv<F32>& begun) const
     {
-        const F32 y = begun.Y * wordUnit;
-        const F32 root = rootBySixTerms(begun.start);
-        const F32 L = lightnessInBlocks(begun.Y, F32(luvLimitOfWords), y * 903.3f, root * 116.0f - 16.0f);
+        const auto& [Y, start, chroma] = begun;
+        const F32 y = Y * wordUnit, root = rootBySixTerms(start);
+        const F32 L = lightnessInBlocks(Y, F32(luvLimitOfWords), y * 903.3f, root * 116.0f - 16.0f);
         const F32 scale = L * 13.0f;
-        const auto [l, u, v] = scaledToWords(L, begun.chroma.u * scale, scale * begun.chroma.v);
+        const auto [l, u, v] = scaledToWords(L, chroma.u * scale, scale * chroma.v);
         return Three{nearest(l), nearest(u), nearest(v)};
     }
 

@@ -4,7 +4,6 @@
 #include "lanes/avx2/pairs_of_floats.hpp"
 
 #include <bit>
-#include <cstdint>
 
 namespace pyxcc
 {
@@ -27,8 +26,8 @@ namespace scalar
 
 template <int Bits, std::size_t Lines> F32 lookUp(const LinesByFloat<Bits, Lines>& lines, F32 x)
 {
-    const Two<f32>& line =
-        lines.line[static_cast<std::size_t>((std::bit_cast<s32>(x.v) >> lines.shift) - lines.before())];
+    const S32 leading = std::bit_cast<s32>(x.v) >> lines.shift;
+    const Two<F32> line = lookUpWithin(lines.line, leading - S32(lines.before()));
     return fused(line.b, x, line.a);
 }
 
@@ -40,11 +39,8 @@ namespace wide
 template <int Bits, std::size_t Lines> PYXCC_INLINE F32 lookUp(const LinesByFloat<Bits, Lines>& lines, F32 x)
 {
     const S32 leading(_mm256_srli_epi32(_mm256_castps_si256(x.v), lines.shift));
-    // The index is less by what is in front of the first line: the address is, at no cost.
-    const auto address = reinterpret_cast<std::uintptr_t>(lines.line.data());
-    const auto* const line =
-        reinterpret_cast<const f32*>(address - sizeof(Two<f32>) * static_cast<u32>(lines.before()));
-    return fused(detail::gather<2>(line + 1, leading), x, detail::gather<2>(line, leading));
+    const Two<F32> line = lookUpWithin(lines.line, leading - S32(lines.before()));
+    return fused(line.b, x, line.a);
 }
 
 } // namespace wide
