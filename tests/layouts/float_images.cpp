@@ -108,6 +108,40 @@ TYPED_TEST_SUITE(FloatImages, Samples, Names);
 
 TYPED_TEST(FloatImages, C3Loads) { expectLoads<TypeParam, InC3>(); }
 TYPED_TEST(FloatImages, C3Stores) { expectStores<TypeParam, InC3>(); }
+// Of 0 to 255 with 16 bits behind the point, which are cut off.
+TEST(FloatImagesOfLevels, C3StoresWholesOfFineLevels)
+{
+    support::Random random(3);
+    for (const Placement placement : placements) {
+        for (int count = 1; count <= block; ++count) {
+            const Memory memory(placement, (firstColumn + count) * InC3::samples);
+            random.fill(memory.all());
+            std::array<std::array<s32, block>, 3> channels;
+            for (auto& channel : channels) {
+                for (s32& x : channel) x = random.between(0, 255) * 65536 + random.between(0, 65535);
+            }
+            std::vector<u8> told(memory.all().begin(), memory.all().end());
+            const auto front = memory.bytes().data() - memory.all().data();
+            for (int c = 0; c < 3; ++c) {
+                for (int i = 0; i < count; ++i)
+                    told[front + (firstColumn + i) * 3 + c] = static_cast<u8>(channels[c][i] / 65536);
+            }
+
+            const auto load = [&](int c) {
+                const auto* const channel = reinterpret_cast<const u8*>(channels[c].data());
+                return pyxcc::fineLevel(layouts::loadSamples<wide::S32>(channel));
+            };
+            const auto row = InC3::row(memory.bytes().data());
+            if (count == block) {
+                row.store(firstColumn, Three{load(0), load(1), load(2)});
+            } else {
+                row.store(firstColumn, count, Three{load(0), load(1), load(2)});
+            }
+            EXPECT_EQ(std::vector<u8>(memory.all().begin(), memory.all().end()), told) << count << " pixels";
+        }
+    }
+}
+
 TYPED_TEST(FloatImages, AC4Loads) { expectLoads<TypeParam, InAC4>(); }
 TYPED_TEST(FloatImages, AC4StoresKeepTheFourth) { expectStores<TypeParam, InAC4>(); }
 
