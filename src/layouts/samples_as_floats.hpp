@@ -16,6 +16,14 @@ template <class Sample> struct AsFloats {
     static PYXCC_INLINE Four<wide::F32> load(const u8* p) { return loadAsFloats<Sample>(p); }
 };
 
+/// 32 samples of words, signed ones 32768 larger.
+template <class Sample> struct AsWords {
+    using Samples = wide::U8;
+    static constexpr int pixelBytes = sizeof(Sample);
+
+    static PYXCC_INLINE Two<wide::U16> load(const u8* p) { return loadAsWords<Sample>(p); }
+};
+
 /// 32 samples, narrowed from what was made of samples of `Source`. Each fourth may be put back as it was.
 template <class Source, class Sample, bool KeepFourths> struct FromFloats {
     using Samples = wide::U8;
@@ -38,6 +46,11 @@ template <class Source, class Sample, bool KeepFourths> struct FromFloats {
 template <class Sample> auto asFloats(const Sample* first, std::ptrdiff_t step)
 {
     return detail::interleaved(first, step, AsFloats<Sample>{});
+}
+
+template <class Sample> auto asWords(const Sample* first, std::ptrdiff_t step)
+{
+    return detail::interleaved(first, step, AsWords<Sample>{});
 }
 
 template <class Source, bool KeepFourths, class Sample> auto fromFloats(Sample* first, std::ptrdiff_t step)

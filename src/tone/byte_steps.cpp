@@ -31,16 +31,15 @@ std::optional<u16> ByteSteps::offsetOf(const ByteFunction& function, int /*place
 /// The slope is rounded down to as many bits as there is room for; few functions take one that is a little flatter.
 /// Each value tells between which 128ths of a step the line may start. Rounding can let the last step have 255 where
 /// those before it, which are to be whole as well, fall short of it, and so does the line then.
-void FineSteps::findValues(int steps, const std::array<u8, most + 2>& values)
+bool StepValues::findLine(int steps, u32 in256ths, const std::array<u8, most + 2>& values)
 {
     const u32 count = static_cast<u32>(steps);
     int bits = 10;
-    while ((255u << (bits + 1)) / count < 65536) ++bits;
-    factor = static_cast<u16>(256 * count);
+    while ((in256ths << (bits - 7)) / count < 65536) ++bits;
     scale = static_cast<u16>(65536 >> (bits - 9));
     s32 least = 0, greatest = -1;
     for (u32 flatter = 0; flatter < 4 && least > greatest; ++flatter) {
-        slope = static_cast<u16>((255u << bits) / count - flatter);
+        slope = static_cast<u16>((in256ths << (bits - 8)) / count - flatter);
         const auto startFor = [&](u32 value, int n) { // the least from which on that step has that value
             return static_cast<s32>(((value << (bits + 7)) + slope - 1u) / slope) - 128 * n;
         };
@@ -50,12 +49,14 @@ void FineSteps::findValues(int steps, const std::array<u8, most + 2>& values)
             if (values[n] < 255) greatest = std::min(greatest, startFor(values[n] + 1u, n) - 1);
             if (n < steps || values[n] < 255) least = std::max(least, startFor(values[n], n));
         }
-        if (values[steps] == 255) {
-            nearTop = startFor(255, steps) > greatest ? 254 : 255;
-            least = std::max(least, startFor(nearTop, steps));
-        }
+        nearTop = values[steps] == 255 && startFor(255, steps) > greatest ? 254 : 255;
+        if (values[steps] == 255) least = std::max(least, startFor(nearTop, steps));
     }
-    excess = static_cast<u16>(128 - least);
+    start = static_cast<u16>(std::clamp(least, 0, 127));
+    for (int n = 0; n <= steps + 1; ++n) {
+        if (at(128u * static_cast<u32>(n) + start) != values[n]) return false;
+    }
+    return true;
 }
 
 /// Of bytes that are on a step, by numbers without an error, rounding has made either less or more: the guess is for

@@ -53,25 +53,53 @@ PYXCC_INLINE wide::U8 lookUp(const ByteSteps& steps, wide::U8 x, const Two<wide:
     return lookUp(steps.valueOf, narrow(numbers(words.a, offsets.a), numbers(words.b, offsets.b)));
 }
 
-/// Functions of up to 255 steps. A byte times the steps is its number in 255ths, exactly; what is added to it is one
-/// step more, for nothing to be below zero.
-struct FineSteps {
+/// What steps are stored as, as a line: 16 steps or more, up to 255, and one more.
+struct StepValues {
     static constexpr int most = 255;
-    static constexpr u16 in128ths = 32897; ///< 2^23 / 255: of a product with 255ths the upper word is 128ths
 
-    u16 factor;       ///< 256 times the steps
-    u8 nudge = 0;     ///< in 256ths of a byte, to all but the lowest: what is on a step counts as above it
-    u16 slope;        ///< of values, over 128ths of a step
-    u16 scale;        ///< of what the slope gives to a value
-    u16 excess;       ///< 128ths to take off: the step more, but for where the line of values starts
-    u8 nearTop = 255; ///< the line's value that stands for 255
+    u16 slope;  ///< over 128ths of a step
+    u16 scale;  ///< of what the slope gives to a value
+    u16 start;  ///< 128ths of a step to start from
+    u8 nearTop; ///< the line's value that stands for 255
 
-    /// `valueOf` gives the value of each step, and of one more.
-    template <class ValueOf> FineSteps(int steps, const ValueOf& valueOf)
+    /// Whether there is one. `valueOf` gives the value of a step, and the last one has about so many 256ths.
+    template <class ValueOf> bool find(int steps, u32 in256ths, const ValueOf& valueOf)
     {
         std::array<u8, most + 2> values;
         for (int n = 0; n <= steps + 1; ++n) values[n] = valueOf(n);
-        findValues(steps, values);
+        return findLine(steps, in256ths, values);
+    }
+
+    u8 at(u32 in128ths) const
+    {
+        const u32 value = std::min(((in128ths * slope) >> 16) * scale >> 16, 255u);
+        return static_cast<u8>(value == nearTop ? 255 : value);
+    }
+
+    PYXCC_INLINE wide::U8 at(wide::U16 in128ths, wide::U16 andIn128ths) const
+    {
+        const auto valuesOf = [&](wide::U16 x)
+                                  PYXCC_INLINE_LAMBDA { return wide::Byte(mulHighU16(mulHighU16(x, slope), scale).v); };
+        const wide::U8 values = narrow(valuesOf(in128ths), valuesOf(andIn128ths));
+        return greater(values, equal(values, nearTop));
+    }
+
+private:
+    bool findLine(int steps, u32 in256ths, const std::array<u8, most + 2>& values);
+};
+
+/// Functions of up to 255 steps. A byte times the steps is its number in 255ths, exactly; what is added to it is one
+/// step more, for nothing to be below zero.
+struct FineSteps {
+    static constexpr u16 in128ths = 32897; ///< 2^23 / 255: of a product with 255ths the upper word is 128ths
+
+    StepValues values;
+    u16 factor;   ///< 256 times the steps
+    u8 nudge = 0; ///< in 256ths of a byte, to all but the lowest: what is on a step counts as above it
+
+    template <class ValueOf> FineSteps(int steps, const ValueOf& valueOf) : factor(static_cast<u16>(256 * steps))
+    {
+        values.find(steps, 65280, valueOf);
     }
 
     /// What is to be added to the line for it to tell a function, which goes up where a byte is more than about so many
@@ -80,30 +108,25 @@ struct FineSteps {
 
     /// Whether there is another line to try.
     bool tryNext();
-
-private:
-    void findValues(int steps, const std::array<u8, most + 2>& values);
 };
 
 inline u8 lookUp(const FineSteps& steps, u8 x, u16 offset)
 {
     const u32 in255ths = ((256u * x + std::min(x, steps.nudge)) * steps.factor >> 16) + offset;
     const u32 in128ths = (static_cast<u16>(in255ths) * u32{FineSteps::in128ths} >> 16) & 0xff80;
-    const u32 less = in128ths > steps.excess ? in128ths - steps.excess : 0;
-    const u32 value = std::min(((less * steps.slope) >> 16) * steps.scale >> 16, 255u);
-    return static_cast<u8>(value == steps.nearTop ? 255 : value);
+    const u32 excess = 128u - steps.values.start;
+    return steps.values.at(in128ths > excess ? in128ths - excess : 0);
 }
 
 PYXCC_INLINE wide::U8 lookUp(const FineSteps& steps, wide::U8 x, const Two<wide::U16>& offsets)
 {
-    const auto values = [&](wide::U16 nudged, wide::U16 offset) PYXCC_INLINE_LAMBDA {
+    const auto numbers = [&](wide::U16 nudged, wide::U16 offset) PYXCC_INLINE_LAMBDA {
         const wide::U16 in255ths = mulHighU16(nudged, steps.factor) + offset;
         const wide::U16 in128ths = mulHighU16(in255ths, FineSteps::in128ths) & wide::U16(0xff80);
-        return wide::Byte(mulHighU16(mulHighU16(subSatU16(in128ths, steps.excess), steps.slope), steps.scale).v);
+        return subSatU16(in128ths, 128 - steps.values.start);
     };
     const Two<wide::U16> words = joined(lesser(x, steps.nudge), x);
-    const wide::U8 value = narrow(values(words.a, offsets.a), values(words.b, offsets.b));
-    return greater(value, equal(value, steps.nearTop));
+    return steps.values.at(numbers(words.a, offsets.a), numbers(words.b, offsets.b));
 }
 
 } // namespace pyxcc::tone

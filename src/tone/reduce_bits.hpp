@@ -6,6 +6,7 @@
 #include "frame/row_driver.hpp"
 #include "layouts/samples_as_floats.hpp"
 #include "tone/diffusion.hpp"
+#include "tone/levels_by_words.hpp"
 #include "tone/reduce_bits_forms.hpp"
 #include "tone/reduce_bits_noise.hpp"
 
@@ -85,7 +86,7 @@ PyxStatus takeSamples(const ReduceBits<Depth>& call, const Source& source, const
                           plan);
 }
 
-/// Steps of bytes are found for a call, which pays where it has many samples.
+/// Steps are found for a call, which pays where it has many samples.
 template <class Pixel, class Depth> bool maySeekSteps(const ReduceBits<Depth>& call)
 {
     constexpr std::int64_t many = 16384;
@@ -95,6 +96,29 @@ template <class Pixel, class Depth> bool maySeekSteps(const ReduceBits<Depth>& c
 /// Integers to bytes.
 template <class Depth>
 inline constexpr bool tellsByNumber = std::is_integral_v<typename Depth::Source> && sizeof(typename Depth::Target) == 1;
+
+/// Those that are taken as words, whose samples are seldom near a threshold.
+template <class Depth> inline constexpr bool goesByWords = tellsByNumber<Depth> && sizeof(typename Depth::Source) == 2;
+
+/// Takes samples as words. `placesOfRow` gives what gives those of a block their place, `planOf` the plan around a
+/// form; the last step has about so many 256ths. Whether there is a line of values, and if there is all is done.
+template <class Pixel, class Depth, class Exact, class ValueOf, class PlacesOfRow, class PlanOf>
+bool takeByWords(const ReduceBits<Depth>& call, const Exact& exact, u32 in256ths, const ValueOf& valueOf,
+                 const PlacesOfRow& placesOfRow, const PlanOf& planOf)
+{
+    if (!maySeekSteps<Pixel>(call)) return false;
+    const auto source = inPlace(layouts::asWords(call.src, call.srcStep), placesOfRow);
+    const int steps = call.levels - 1;
+    if (call.levels < FewLevels::most) {
+        takeSamples<Pixel>(call, source,
+                           planOf(ByWords<Exact, FewNumbers>{exact, FewNumbers{FewLevels(valueOf)}, steps}));
+        return true;
+    }
+    ManyNumbers numbers;
+    if (!numbers.values.find(steps, in256ths, valueOf)) return false;
+    takeSamples<Pixel>(call, source, planOf(ByWords<Exact, ManyNumbers>{exact, numbers, steps}));
+    return true;
+}
 
 /// Whether there are such steps, and if there are all is done.
 template <class Pixel, class Depth, class Steps> bool takeNearestBySteps(const ReduceBits<Depth>& call, Steps steps)
@@ -127,6 +151,17 @@ template <class Pixel, class Depth> PyxStatus takeNearest(const ReduceBits<Depth
             return pyxOk;
     }
     const auto source = layouts::asFloats(call.src, call.srcStep);
+    if constexpr (goesByWords<Depth>) {
+        const auto places = [](int) {
+            return [](const Two<wide::U16>& words, int) PYXCC_INLINE_LAMBDA {
+                return WordsInPlace<typename Depth::Source, void>{words, {32767, 32767}, nullptr, 0, 0};
+            };
+        };
+        if (takeByWords<Pixel>(
+                call, wide, 65280, [&](int n) { return wide.valueOf(n); }, places,
+                [&](const auto& byWords) { return frame::wideThenTail<8>(byWords, tail); }))
+            return pyxOk;
+    }
     if constexpr (tellsByNumber<Depth>) {
         if (call.levels <= FewLevels::most)
             return takeSamples<Pixel>(call, source, frame::wideThenTail<8>(NearestOfFew<Depth>(call.levels), tail));
@@ -156,6 +191,24 @@ PyxStatus takeByThresholds(const ReduceBits<Depth>& call, const Levels& levels, 
             return takeSamples<Pixel>(call, source, eightPixelsThenTail<Pixel>(OrderedOfFew<Depth>(levels), tail));
     }
     return takeSamples<Pixel>(call, source, eightPixelsThenTail<Pixel>(OrderedWide<Depth>{levels}, tail));
+}
+
+/// `thresholds` gives those of a row in 65535ths of a step, and `exactThresholds` those of a block, by its first column
+/// and its row.
+template <class Pixel, class Depth, class ThresholdsOfRow, class ExactThresholds>
+bool takeOrderedByWords(const ReduceBits<Depth>& call, const Levels& levels, const ThresholdsOfRow& thresholds,
+                        const ExactThresholds& exactThresholds)
+{
+    using Source = typename Depth::Source;
+    const auto places = [&](int y) {
+        return [&ofRow = thresholds(y), &exactThresholds, y](const Two<wide::U16>& words, int x) PYXCC_INLINE_LAMBDA {
+            return WordsInPlace<Source, ExactThresholds>{
+                words, layouts::loadAsWords<u16>(layouts::bytes(ofRow.from(x))), &exactThresholds, x, y};
+        };
+    };
+    return takeByWords<Pixel>(
+        call, OrderedWide<Depth>{levels}, 65535, [&](int n) { return valueOfStep<Depth>(n, levels.step); }, places,
+        [&](const auto& byWords) { return eightPixelsThenTail<Pixel>(byWords, OrderedTail<Depth>{levels}); });
 }
 
 /// Entries of the ordered matrix, in fifteenths.
@@ -277,6 +330,18 @@ template <class Pixel, class Depth> PyxStatus takeOrdered(const ReduceBits<Depth
                 (call.levels <= ByteSteps::most
                      ? takeOrderedBySteps<Pixel>(call, levels, ByteSteps(steps), thresholds)
                      : takeOrderedBySteps<Pixel>(call, levels, FineSteps(steps, valueOf), thresholds)))
+                return pyxOk;
+        }
+        if constexpr (goesByWords<Depth>) {
+            Pattern<Pixel, u16> in65535ths[4];
+            for (int y = 0; y < 4; ++y)
+                in65535ths[y].template set<Pixel>(
+                    8, [&](int x) { return static_cast<u16>(std::lround(65535 * matrix[y][x & 3])); });
+            if (takeOrderedByWords<Pixel>(
+                    call, levels, [&](int y) -> const auto& { return in65535ths[y & 3]; },
+                    [&](int x, int y) {
+                        return layouts::loadFloatsInOrderOf<typename Depth::Source>(thresholds[y & 3].from(x));
+                    }))
                 return pyxOk;
         }
         return takeByThresholds<Pixel>(

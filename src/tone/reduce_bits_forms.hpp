@@ -94,7 +94,7 @@ template <class Depth> u8 valueOfStep(int n, f32 step)
 
 /// The level below, or the one above it where what is left exceeds the threshold.
 template <class Depth> struct OrderedWide {
-    static constexpr bool storedLate = true;
+    static constexpr bool storedLate = true, takesThreshold = true;
 
     Levels levels;
 
@@ -107,6 +107,8 @@ template <class Depth> struct OrderedWide {
 };
 
 template <class Depth> struct OrderedTail {
+    static constexpr bool takesThreshold = true;
+
     Levels levels;
 
     template <class F32> PYXCC_INLINE auto operator()(const F32& p, const F32& threshold) const

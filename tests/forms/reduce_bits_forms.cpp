@@ -2,6 +2,8 @@
 // row after the other.
 #include "rounding_modes.hpp"
 
+#include "pyxcc/reduce_bits.h"
+#include "reference/reduce_bits.hpp"
 #include "tone/diffusion.hpp"
 #include "tone/reduce_bits.hpp"
 
@@ -269,6 +271,33 @@ TEST(FineSteps, RefuseOtherFunctions)
     ++function[100];
     EXPECT_FALSE(steps.offsetOf(function, 127)) << "another value of one byte";
     EXPECT_FALSE(steps.offsetOf(nearestOfEveryByte(101), 127)) << "more steps";
+}
+
+/// All words in all places of the matrix, in an image for which steps are sought.
+TEST(ByWords, EveryWordInEveryPlace)
+{
+    const RoiSize roi = {1024, 256};
+    const std::size_t count = std::size_t{1024} * 256;
+    std::vector<u16> source(count);
+    std::vector<u8> expected(count), found(count);
+    for (int shift = 0; shift < 4; ++shift) {
+        for (int y = 0; y < roi.height; ++y) {
+            for (int x = 0; x < roi.width; ++x) {
+                const int word = (y + shift) % 64 * 1024 + (x + y / 64) % 1024;
+                source[static_cast<std::size_t>(y) * 1024 + static_cast<std::size_t>(x)] = static_cast<u16>(word);
+            }
+        }
+        for (const s32 levels : {2, 5, 15, 16, 17, 64, 100, 136, 172, 201, 256}) {
+            for (const u32 method : {0u, 4u}) {
+                ASSERT_EQ(reference::pyxiReduceBits_16u8u_C1R(source.data(), 2048, expected.data(), 1024, roi, 0,
+                                                              method, levels),
+                          pyxOk);
+                ASSERT_EQ(pyxiReduceBits_16u8u_C1R(source.data(), 2048, found.data(), 1024, roi, 0, method, levels),
+                          pyxOk);
+                ASSERT_EQ(found, expected) << levels << " levels by method " << method;
+            }
+        }
+    }
 }
 
 /// An image of one channel through a diffusion by bands of so many rows.

@@ -14,4 +14,10 @@ PYXCC_INLINE Two<U16> joined(U8 low, U8 high)
 
 PYXCC_INLINE U16 subSatU16(U16 x, U16 y) { return U16(_mm256_subs_epu16(x.v, y.v)); }
 
+/// Whether x <= y in any lane.
+PYXCC_INLINE bool anyAtMost(U16 x, U16 y)
+{
+    return _mm256_movemask_epi8(_mm256_cmpeq_epi16(_mm256_min_epu16(x.v, y.v), x.v)) != 0;
+}
+
 } // namespace pyxcc::wide

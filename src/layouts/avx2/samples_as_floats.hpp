@@ -41,6 +41,16 @@ template <class Sample> PYXCC_INLINE Four<wide::F32> loadFloatsInOrderOf(const f
     }
 }
 
+/// Reads 64 bytes of words, signed ones 32768 larger.
+template <class Sample> PYXCC_INLINE Two<wide::U16> loadAsWords(const u8* p)
+{
+    if constexpr (std::is_signed_v<Sample>) {
+        return {raised(loadSamples<wide::S16>(p)), raised(loadSamples<wide::S16>(p + 32))};
+    } else {
+        return {loadSamples<wide::U16>(p), loadSamples<wide::U16>(p + 32)};
+    }
+}
+
 /// Reads 32 words in the order of widened bytes.
 PYXCC_INLINE Two<wide::U16> loadWordsInOrderOfBytes(const u16* p)
 {
