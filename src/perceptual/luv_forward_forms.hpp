@@ -144,7 +144,7 @@ struct RgbToLuvOfBytes : frame::OnFloats {
         static constexpr WeightsAndMore kx = scaledWeights(xOfRgb, ofX), ky = raisedWeights(yOfRgb, unit),
                                         kd = scaledWeights(luvDenominatorOfRgb, ofD, 1e-30f);
         const F32 x = weighted(kx, R, G, B), y = weighted(ky, R, G, B), e = refinedByFused(weighted(kd, R, G, B));
-        constexpr f32 whiteU = -un * 13 * u1, whiteV = -vn * 13 * v1;
+        constexpr auto whiteU = static_cast<f32>(-un * 13 * u1), whiteV = static_cast<f32>(-vn * 13 * v1);
         const F32 L = lookUp(lightnessLines, y);
         const F32 u = fused(x, e, F32(whiteU)), v = fused(y - ky.more, e, F32(whiteV));
         constexpr f32 levelsOfL = L1, grayU = 134 * u1 + aboveLevel, grayV = 140 * v1 + aboveLevel;
