@@ -89,13 +89,13 @@ namespace detail
 template <int Registers> PYXCC_INLINE Several<wide::U8, Registers> loadLuma(const u8* p)
 {
     Several<wide::U8, Registers> samples;
-    for (int k = 0; k < Registers; ++k) samples.part[k] = loadSamples(p + 32 * k);
+    for (int k = 0; k < Registers; ++k) samples.part[k] = loadSamples(p + std::ptrdiff_t{32} * k);
     return samples;
 }
 
 template <int Registers> PYXCC_INLINE void storeLuma(u8* p, const Several<wide::U8, Registers>& samples)
 {
-    for (int k = 0; k < Registers; ++k) storeSamples(p + 32 * k, samples.part[k]);
+    for (int k = 0; k < Registers; ++k) storeSamples(p + std::ptrdiff_t{32} * k, samples.part[k]);
 }
 
 } // namespace detail
