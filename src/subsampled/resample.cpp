@@ -154,7 +154,7 @@ void from411To420(const Source& source, const Target& target, int n, int height)
     for (int j = 0; j < height / 2; ++j) {
         const u8* const from = source.row(2 * j);
         u8* const to = target.row(j);
-        eachBlock(n, columnsUpAlong(n), [&](int k, const auto& block) PYXCC_INLINE_LAMBDA {
+        eachBlock(n, columnsUpAlong(n), [&](std::ptrdiff_t k, const auto& block) PYXCC_INLINE_LAMBDA {
             const HalfWay x = block.loadHalfWay(from + k);
             block.storeByTurns(to + 2 * k, x.own, x.between);
         });
@@ -168,7 +168,7 @@ void from1620To420(const Source& source, const Target& target, int n, int height
     for (int r = 0; r < last; ++r) {
         const u8 *const from = source.row(r), *const below = source.row(r + 1);
         u8 *const to = target.row(2 * r), *const between = target.row(2 * r + 1);
-        eachBlock(n, columnsUpAlong(n), [&](int k, const auto& block) PYXCC_INLINE_LAMBDA {
+        eachBlock(n, columnsUpAlong(n), [&](std::ptrdiff_t k, const auto& block) PYXCC_INLINE_LAMBDA {
             const HalfWay x = block.loadHalfWay(from + k), y = block.loadHalfWay(below + k);
             block.storeByTurns(to + 2 * k, x.own, x.between);
             block.storeByTurns(between + 2 * k, block.average(x.own, y.own), block.average(x.between, y.between));
@@ -176,7 +176,7 @@ void from1620To420(const Source& source, const Target& target, int n, int height
     }
     const u8* const from = source.row(last);
     u8 *const to = target.row(2 * last), *const below = target.row(2 * last + 1);
-    eachBlock(n, columnsUpAlong(n), [&](int k, const auto& block) PYXCC_INLINE_LAMBDA {
+    eachBlock(n, columnsUpAlong(n), [&](std::ptrdiff_t k, const auto& block) PYXCC_INLINE_LAMBDA {
         const HalfWay x = block.loadHalfWay(from + k);
         block.storeByTurns(to + 2 * k, x.own, x.between);
         block.storeByTurns(below + 2 * k, x.own, x.own);
@@ -192,7 +192,7 @@ void from420To411(const Source& source, const Target& target, int n, int height)
     for (int r = 0; r <= last; ++r) {
         const u8 *const from = source.row(r), *const below = source.row(std::min(r + 1, last));
         u8 *const to = target.row(2 * r), *const between = target.row(2 * r + 1);
-        eachBlock(n, columnsUpBetween(n), [&](int i, const auto& block) PYXCC_INLINE_LAMBDA {
+        eachBlock(n, columnsUpBetween(n), [&](std::ptrdiff_t i, const auto& block) PYXCC_INLINE_LAMBDA {
             const U8 x = block.loadEveryOther(from + 2 * i), y = block.loadEveryOther(below + 2 * i);
             block.store(to + i, x);
             block.store(between + i, block.average(x, y));
@@ -206,7 +206,7 @@ void from420To1620(const Source& source, const Target& target, int n, int height
     for (int r = 0; r < height / 4; ++r) {
         const u8* const from = source.row(2 * r);
         u8* const to = target.row(r);
-        eachBlock(n, columnsUpBetween(n), [&](int i, const auto& block) PYXCC_INLINE_LAMBDA {
+        eachBlock(n, columnsUpBetween(n), [&](std::ptrdiff_t i, const auto& block) PYXCC_INLINE_LAMBDA {
             block.store(to + i, block.loadEveryOther(from + 2 * i));
         });
     }
