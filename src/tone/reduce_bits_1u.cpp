@@ -75,7 +75,7 @@ struct BitDiffusion {
                 continue;
             }
             for (int r = 0; r < band.rows; ++r) {
-                const u8* const row = rowAt(band.source, band.sourceStep, r) - Lag * r;
+                const u8* const row = rowAt(band.source, band.sourceStep, r) - std::ptrdiff_t{Lag} * r;
                 const int from = std::max(t, Lag * r), to = std::min(t + some, band.width + Lag * r);
                 for (int column = from; column < to; ++column) stage.samples[column - first][r] = row[column];
             }

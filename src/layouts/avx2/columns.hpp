@@ -35,7 +35,7 @@ template <int times> PYXCC_INLINE void storeRepeated(f32* to, wide::F32 x)
         const __m256i places =
             _mm256_setr_epi32(source(0), source(1), source(2), source(3), source(4), source(5), source(6), source(7));
         const __m256 repeated = times == 1 ? x.v : _mm256_permutevar8x32_ps(x.v, places);
-        _mm256_storeu_ps(to + 8 * i, repeated);
+        _mm256_storeu_ps(to + std::ptrdiff_t{8} * i, repeated);
     }
 }
 
@@ -45,8 +45,9 @@ PYXCC_INLINE void turnEights(const u8* from, std::ptrdiff_t step, u8* to)
     const auto row = [=](int y) PYXCC_INLINE_LAMBDA {
         return _mm_loadl_epi64(reinterpret_cast<const __m128i*>(from + step * y));
     };
-    const auto store = [=](int i, __m128i columns)
-                           PYXCC_INLINE_LAMBDA { _mm_storeu_si128(reinterpret_cast<__m128i*>(to + 16 * i), columns); };
+    const auto store = [=](int i, __m128i columns) PYXCC_INLINE_LAMBDA {
+        _mm_storeu_si128(reinterpret_cast<__m128i*>(to + std::ptrdiff_t{16} * i), columns);
+    };
     const __m128i twos01 = _mm_unpacklo_epi8(row(0), row(1)), twos23 = _mm_unpacklo_epi8(row(2), row(3));
     const __m128i twos45 = _mm_unpacklo_epi8(row(4), row(5)), twos67 = _mm_unpacklo_epi8(row(6), row(7));
     const __m128i low = _mm_unpacklo_epi16(twos01, twos23), high = _mm_unpackhi_epi16(twos01, twos23);
