@@ -38,7 +38,7 @@ constexpr u32 next(u32 x) { return x * 69069 + 1013904243; }
 template <class Number> s32 step(NoiseGenerator<Number>& record)
 {
     const u32 t = record.s1 - record.s2 + record.d;
-    record.d = static_cast<u32>(static_cast<s32>(t) >> 31); // all bits where it borrows
+    record.d = 0 - (t >> 31); // all bits where it borrows
     record.s2 = record.s1;
     record.s1 = record.s0;
     record.s0 = t - (record.d & 18);
